@@ -20,3 +20,8 @@ if(PENMOOR_SANITIZE)
     add_compile_options(-fsanitize=${PENMOOR_SANITIZE} -fno-omit-frame-pointer -fno-sanitize-recover=undefined)
     add_link_options(-fsanitize=${PENMOOR_SANITIZE})
 endif()
+
+# Fuzz builds instrument every library for coverage; only the fuzz targets link the fuzzer.
+if(PENMOOR_BUILD_FUZZ)
+    add_compile_options(-fsanitize=fuzzer-no-link)
+endif()
