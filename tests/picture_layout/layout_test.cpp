@@ -38,7 +38,14 @@ protected:
             = static_cast<std::uint32_t>(found - region.formats.begin());
     }
 
-    void setValue(int row, int column, xl::Value value) { region.values.push_back({ row, column, std::move(value) }); }
+    void setValue(int row, int column, const xl::Value& value)
+    {
+        CellValue cell;
+        cell.row = row;
+        cell.column = column;
+        cell.value = value;
+        region.values.push_back(cell);
+    }
 
     PictureLayout layout() const { return layOutPicture(region, metrics); }
 
@@ -185,7 +192,8 @@ TEST_F(LayoutTest, ExplicitAlignmentsAndColours)
     format.vertical = VerticalAlignment::Center;
     format.numberFormat = "[Blue]0";
     setFormat(0, 0, format);
-    region.values = { { 0, 0, 5.0 } };
+    region.values.clear();
+    setValue(0, 0, 5.0);
     picture = layout();
     ASSERT_EQ(picture.texts.size(), 1u);
     EXPECT_EQ(picture.texts[0].baseline, 1 + (39 - 13) / 2 + 10);
