@@ -2,28 +2,14 @@
 #include "spreadsheet/picture/bmpfile.h"
 #include "spreadsheet/picture/sheetpainter.h"
 
-#include <memory>
-
-#include <QGuiApplication>
-
 #include <gtest/gtest.h>
 
 namespace penmoor::picture {
 namespace {
 
-// One application object for the whole test program; painting text needs it.
+// Paints small synthetic sheets and probes pixels; paint_main.cpp provides the application.
 class PaintTest : public ::testing::Test {
 protected:
-    static void SetUpTestSuite()
-    {
-        if (!QGuiApplication::instance()) {
-            static int argc = 1;
-            static char name[] = "picture_paint_test";
-            static char* argv[] = { name, nullptr };
-            static std::unique_ptr<QGuiApplication> application = std::make_unique<QGuiApplication>(argc, argv);
-        }
-    }
-
     // Columns of 10 characters (75 pixels) and rows of 15 points (20 pixels), with the
     // palette colours k * 0x030507 so that every index is told apart.
     void makeSheet(int rows, int columns)
