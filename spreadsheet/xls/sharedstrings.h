@@ -17,6 +17,8 @@ class SharedStrings {
 public:
     // The index of this UTF-8 text, adding it on first use; counts one more use.
     std::uint32_t add(std::string_view text);
+    // The index of a text already added.
+    std::uint32_t indexOf(const std::string& text) const { return m_index.at(text); }
 
     std::uint32_t totalCount() const { return m_total; }
     std::uint32_t uniqueCount() const { return static_cast<std::uint32_t>(m_strings.size()); }

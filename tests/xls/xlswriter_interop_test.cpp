@@ -1,0 +1,330 @@
+// Our files read by someone else: python3-olefile sees one Workbook stream, python3-xlrd reads
+// the content and formatting the model holds, Gnumeric recalculates every formula to the value
+// we cached, and LibreOffice reads the page setup.
+#include "spreadsheet/xls/biffrecords.h"
+#include "spreadsheet/xls/compoundfilewriter.h"
+#include "spreadsheet/xls/recordreader.h"
+#include "spreadsheet/xls/sheetrecords.h"
+#include "spreadsheet/xls/xlswriter.h"
+#include "tests/xls/support/expecteddump.h"
+#include "tests/xls/support/readers.h"
+#include "tests/xls/support/sampleworkbooks.h"
+#include "tests/xls/support/tempdir.h"
+
+#include <chrono>
+#include <cmath>
+#include <cstdio>
+#include <cstring>
+#include <fstream>
+#include <functional>
+#include <iterator>
+#include <map>
+#include <sstream>
+
+#include <gtest/gtest.h>
+
+namespace penmoor::xls {
+namespace {
+
+using namespace engine;
+
+Workbook sampleBook()
+{
+    Workbook book = test::cashFlowSample();
+    test::addOddsAndEnds(book);
+    return book;
+}
+
+std::filesystem::path saveBytes(
+    const test::TempDir& folder, const std::vector<std::uint8_t>& bytes, const std::string& name)
+{
+    const auto path = folder.file(name);
+    std::ofstream out(path, std::ios::binary);
+    out.write(reinterpret_cast<const char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()));
+    return path;
+}
+
+std::filesystem::path saveSample(const test::TempDir& folder, const Workbook& book, const std::string& name)
+{
+    return saveBytes(folder, writeXls(book), name);
+}
+
+// Calls visit(sheet index, position, cached value) for every formula of the workbook.
+void forEachFormula(const Workbook& book, const std::function<void(int, CellPosition, const xl::Value&)>& visit)
+{
+    for (int index = 0; index < book.sheetCount(); ++index) {
+        book.sheet(index).forEachContent(Region::wholeSheet(), [&](CellPosition position, const CellContent& content) {
+            if (const Formula* formula = std::get_if<Formula>(&content))
+                visit(index, position, formula->cachedValue);
+        });
+    }
+}
+
+std::string cellName(CellPosition position)
+{
+    return columnLetters(position.column) + std::to_string(position.row);
+}
+
+// The fields of CSV text: rows of fields, quotes removed.
+std::vector<std::vector<std::string>> parseCsv(const std::string& text)
+{
+    std::vector<std::vector<std::string>> rows(1);
+    std::string field;
+    bool quoted = false;
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        const char c = text[i];
+        if (quoted) {
+            if (c == '"' && i + 1 < text.size() && text[i + 1] == '"') {
+                field += '"';
+                ++i;
+            } else if (c == '"') {
+                quoted = false;
+            } else {
+                field += c;
+            }
+        } else if (c == '"') {
+            quoted = true;
+        } else if (c == ',') {
+            rows.back().push_back(field);
+            field.clear();
+        } else if (c == '\n') {
+            rows.back().push_back(field);
+            field.clear();
+            rows.emplace_back();
+        } else if (c != '\r') {
+            field += c;
+        }
+    }
+    if (!field.empty() || !rows.back().empty())
+        rows.back().push_back(field);
+    return rows;
+}
+
+const char* errorText(xl::ErrorValue error)
+{
+    switch (error) {
+    case xl::ErrorValue::Null:
+        return "#NULL!";
+    case xl::ErrorValue::Div0:
+        return "#DIV/0!";
+    case xl::ErrorValue::Value:
+        return "#VALUE!";
+    case xl::ErrorValue::Ref:
+        return "#REF!";
+    case xl::ErrorValue::Name:
+        return "#NAME?";
+    case xl::ErrorValue::Num:
+        return "#NUM!";
+    case xl::ErrorValue::NA:
+        return "#N/A";
+    }
+    return "?";
+}
+
+bool sameNumber(double expected, const std::string& text)
+{
+    char* end = nullptr;
+    const double actual = std::strtod(text.c_str(), &end);
+    return end != text.c_str() && *end == '\0'
+        && std::abs(actual - expected) <= 1e-12 * std::max(1.0, std::abs(expected));
+}
+
+// Where Gnumeric's CSV export starts: the first row and column that hold content.
+CellPosition contentOrigin(const Sheet& sheet)
+{
+    CellPosition origin { kMaxRows, kMaxColumns };
+    sheet.forEachContent(Region::wholeSheet(), [&](CellPosition position, const CellContent&) {
+        origin.row = std::min(origin.row, position.row);
+        origin.column = std::min(origin.column, position.column);
+    });
+    return origin;
+}
+
+TEST(XlsInterop, OlefileSeesOneWorkbookStream)
+{
+    PENMOOR_NEED_READER(test::hasPythonModule("olefile"), "python3-olefile");
+    test::TempDir folder;
+    const Workbook book = sampleBook();
+    const auto path = saveSample(folder, book, "sample.xls");
+    const auto expected = "Workbook " + std::to_string(writeWorkbookStream(book).size());
+    EXPECT_EQ(test::lines(test::runPythonScript("olefile_list.py", { path.string() })),
+        std::vector<std::string> { expected });
+}
+
+TEST(XlsInterop, XlrdReadsWhatTheModelHolds)
+{
+    PENMOOR_NEED_READER(test::hasPythonModule("xlrd"), "python3-xlrd");
+    test::TempDir folder;
+    const Workbook book = sampleBook();
+    const auto path = saveSample(folder, book, "sample.xls");
+    const auto actual = test::lines(test::runPythonScript("xlrd_dump.py", { path.string() }));
+    const auto expected = test::expectedXlrdDump(book);
+    EXPECT_EQ(test::lineDifferences(expected, actual), "");
+}
+
+// Gnumeric recalculates every formula from our tokens; each result must equal the one we cached.
+TEST(XlsInterop, GnumericRecalculatesToTheCachedResults)
+{
+    PENMOOR_NEED_READER(test::hasProgram("ssconvert"), "ssconvert (gnumeric)");
+    test::TempDir folder;
+    const Workbook book = sampleBook();
+    const auto path = saveSample(folder, book, "sample.xls");
+    const auto pattern = folder.file("sheet%n.csv").string();
+    const auto result = test::runCommand({ "ssconvert", "--recalc", "-S", "--export-type=Gnumeric_stf:stf_assistant",
+        "-O", "separator=, format=raw quoting-mode=auto", path.string(), pattern });
+    ASSERT_EQ(result.exitCode, 0) << result.errors;
+    std::vector<std::vector<std::vector<std::string>>> sheets;
+    std::vector<CellPosition> origins;
+    for (int index = 0; index < book.sheetCount(); ++index) {
+        std::ifstream in(folder.file("sheet" + std::to_string(index) + ".csv"));
+        std::ostringstream text;
+        text << in.rdbuf();
+        sheets.push_back(parseCsv(text.str()));
+        origins.push_back(contentOrigin(book.sheet(index)));
+    }
+    int checked = 0;
+    forEachFormula(book, [&](int index, CellPosition position, const xl::Value& cached) {
+        const auto& rows = sheets[static_cast<std::size_t>(index)];
+        const auto row = static_cast<std::size_t>(position.row - origins[static_cast<std::size_t>(index)].row);
+        const auto column = static_cast<std::size_t>(position.column - origins[static_cast<std::size_t>(index)].column);
+        const std::string shown = row < rows.size() && column < rows[row].size() ? rows[row][column] : "";
+        const std::string where = "sheet " + std::to_string(index) + " " + cellName(position);
+        if (const double* number = std::get_if<double>(&cached)) {
+            EXPECT_TRUE(sameNumber(*number, shown)) << where << ": cached " << *number << ", Gnumeric " << shown;
+        } else if (const std::string* text = std::get_if<std::string>(&cached)) {
+            EXPECT_EQ(shown, *text) << where;
+        } else if (const bool* flag = std::get_if<bool>(&cached)) {
+            EXPECT_EQ(shown, *flag ? "TRUE" : "FALSE") << where;
+        } else if (const xl::ErrorValue* error = std::get_if<xl::ErrorValue>(&cached)) {
+            EXPECT_EQ(shown, errorText(*error)) << where;
+        }
+        ++checked;
+    });
+    EXPECT_EQ(checked, 14);
+}
+
+// "1900-03-01" style text of a 1900-system date serial (valid from March 1900 on).
+std::string isoDate(double serial)
+{
+    using namespace std::chrono;
+    const year_month_day date { sys_days { 1899y / December / 30 } + days { static_cast<int>(serial) } };
+    char text[16];
+    std::snprintf(text, sizeof text, "%04d-%02u-%02u", static_cast<int>(date.year()),
+        static_cast<unsigned>(date.month()), static_cast<unsigned>(date.day()));
+    return text;
+}
+
+std::string inches(double value)
+{
+    char text[32];
+    std::snprintf(text, sizeof text, "%gin", value);
+    return text;
+}
+
+// What lo_fods_dump.py prints for a sheet's page: orientation, paper, margins and scaling, in
+// LibreOffice's own units.
+std::string expectedPage(int index, const PageSetup& page)
+{
+    const bool landscape = page.orientation == Orientation::Landscape;
+    std::string width = page.paperSize == 9 ? "8.2681in" : "8.5in";
+    std::string height = page.paperSize == 9 ? "11.6929in" : "11in";
+    if (landscape)
+        std::swap(width, height);
+    std::string line = "page " + std::to_string(index) + " margin-bottom=" + inches(page.bottomMarginInches)
+        + " margin-left=" + inches(page.leftMarginInches) + " margin-right=" + inches(page.rightMarginInches)
+        + " margin-top=" + inches(page.topMarginInches) + " page-height=" + height + " page-width=" + width
+        + " print-orientation=" + (landscape ? "landscape" : "portrait");
+    if (page.zoomPercent)
+        line += " scale-to=" + std::to_string(*page.zoomPercent) + "%";
+    else
+        line += " scale-to-X=" + std::to_string(page.fitToPagesWide)
+            + " scale-to-Y=" + std::to_string(page.fitToPagesTall);
+    return line;
+}
+
+std::vector<std::string> libreOfficeDump(const test::TempDir& folder, const std::filesystem::path& file)
+{
+    const auto converted = test::convertWithLibreOffice(file, "fods", folder.path());
+    if (converted.empty())
+        return {};
+    return test::lines(test::runPythonScript("lo_fods_dump.py", { converted.string() }));
+}
+
+// The numbers LibreOffice shows for the formula cells, by "sheet row column".
+std::map<std::string, std::string> shownNumbers(const std::vector<std::string>& dump)
+{
+    std::map<std::string, std::string> numbers;
+    for (const std::string& line : dump) {
+        std::istringstream in(line);
+        std::string kind, sheet, row, column, type, value;
+        in >> kind >> sheet >> row >> column >> type >> value;
+        if (kind == "value" && (type == "float" || type == "date"))
+            numbers[sheet + " " + row + " " + column] = value;
+    }
+    return numbers;
+}
+
+TEST(XlsInterop, LibreOfficeReadsThePageSetupAndRecalculates)
+{
+    PENMOOR_NEED_READER(test::hasProgram("soffice"), "LibreOffice (libreoffice-calc-nogui)");
+    test::TempDir folder;
+    const Workbook book = sampleBook();
+    const auto dump = libreOfficeDump(folder, saveSample(folder, book, "sample.xls"));
+    for (int index = 0; index < book.sheetCount(); ++index) {
+        const std::string expected = expectedPage(index, book.sheet(index).pageSetup());
+        // Properties sorted by name, as the script prints them.
+        std::istringstream words(expected);
+        std::vector<std::string> fields(std::istream_iterator<std::string> { words }, {});
+        std::sort(fields.begin() + 2, fields.end());
+        std::string sorted;
+        for (const std::string& field : fields)
+            sorted += (sorted.empty() ? "" : " ") + field;
+        EXPECT_NE(std::find(dump.begin(), dump.end(), sorted), dump.end()) << "missing: " << sorted;
+    }
+    const auto numbers = shownNumbers(dump);
+    forEachFormula(book, [&](int index, CellPosition position, const xl::Value& cached) {
+        const double* number = std::get_if<double>(&cached);
+        if (!number)
+            return;
+        const std::string key = std::to_string(index) + " " + std::to_string(position.row - 1) + " "
+            + std::to_string(position.column - 1);
+        const auto it = numbers.find(key);
+        ASSERT_NE(it, numbers.end()) << "LibreOffice shows no number at " << cellName(position);
+        if (it->second.find('-') != std::string::npos && it->second.size() == 10)
+            EXPECT_EQ(it->second, isoDate(*number)) << cellName(position);
+        else
+            EXPECT_TRUE(sameNumber(*number, it->second)) << cellName(position) << ": " << it->second;
+    });
+}
+
+// LibreOffice must compute the results itself, not show ours: with a wrong cached result in
+// C7 (350 there), it still shows 350.
+TEST(XlsInterop, LibreOfficeDoesNotTrustCachedResults)
+{
+    PENMOOR_NEED_READER(test::hasProgram("soffice"), "LibreOffice (libreoffice-calc-nogui)");
+    test::TempDir folder;
+    auto stream = writeWorkbookStream(test::cashFlowSample());
+    RecordReader records(stream, 0);
+    bool patched = false;
+    while (!records.atEnd() && records.peekType() != 0) {
+        const Record record = records.next();
+        if (record.type != biff::kFormula)
+            continue;
+        const CellHeader cell = parseCellHeader(record.body);
+        if (cell.row == 6 && cell.column == 2) {
+            const std::size_t valueAt = record.offset + biff::kRecordHeaderSize + 6;
+            const double wrong = 999;
+            std::memcpy(stream.data() + valueAt, &wrong, sizeof wrong); // little-endian hosts only, as in CI
+            patched = true;
+        }
+    }
+    ASSERT_TRUE(patched);
+    const CompoundStream workbook { u"Workbook", stream };
+    const auto file = saveBytes(folder, writeCompoundFile({ &workbook, 1 }), "patched.xls");
+    const auto numbers = shownNumbers(libreOfficeDump(folder, file));
+    ASSERT_TRUE(numbers.count("0 6 2"));
+    EXPECT_EQ(numbers.at("0 6 2"), "350");
+}
+
+} // namespace
+} // namespace penmoor::xls
