@@ -358,6 +358,8 @@ NumberFormat::Section NumberFormat::Section::parse(std::string_view code)
             i += characterLength(code, i);
             continue;
         }
+        // One-character tokens end here; quoted text, escapes, spacing, fills and brackets have
+        // already moved past themselves.
         if (c != '"' && c != '\\' && c != '_' && c != '*' && c != '[') {
             ++i;
         }
@@ -780,7 +782,7 @@ NumberFormat::NumberFormat(std::string_view code)
             continue;
         }
         const char c = code[i];
-        if (c == '\\' && !quoted) {
+        if (c == '\\' && !quoted && i + 1 < code.size()) {
             ++i;
         } else if (c == '"') {
             quoted = !quoted;

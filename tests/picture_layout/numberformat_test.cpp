@@ -198,10 +198,36 @@ TEST(NumberFormatTest, FillCharacterAndMalformedCodes)
     EXPECT_EQ(filled.forms.front().fillCharacter, "-");
     // Unbalanced quotes and brackets never fail; what is left shows as text.
     expectCases({
-        { "0\"abc", 3.0, "3abc" },
-        { "0[", 3.0, "3[" },
-        { "", 3.0, "3" },
+        { "0\"abc", 3.0, "3abc" }, { "0[", 3.0, "3[" }, { "", 3.0, "3" },
+        { "0\\", 3.0, "3\\" }, // a trailing backslash still ends the section
     });
+}
+
+TEST(NumberFormatTest, EveryPrefixOfAnyCodeIsSafeToShow)
+{
+    // Cut anywhere (inside quotes, escapes, brackets, multi-byte characters), a code still
+    // parses and shows every kind of value without reading out of bounds.
+    const char* codes[] = {
+        "[Red][>=100]#,##0.00_);[Blue](#,##0.00);\"zero\";@\" txt\"",
+        "[$\xE2\x82\xAC-407] * #,##0.0,,E+00%",
+        "[h]:mm:ss.000 AM/PM dddd mmmmm yy \\\\ _( *- ?/?",
+        "\xE2\x82\xAC\\\xE2\x82\xAC"
+        "0;[Color57]0;[<>0]0;[",
+    };
+    const xl::Value values[]
+        = { 0.0, -1234.5678, 1e300, 5e-324, 41275.75, std::string("t"), true, xl::ErrorValue::Num };
+    for (const char* code : codes) {
+        const std::string full(code);
+        for (std::size_t length = 0; length <= full.size(); ++length) {
+            const NumberFormat format(full.substr(0, length));
+            for (const xl::Value& value : values) {
+                const ShownValue shown = format.show(value);
+                for (const ShownForm& form : shown.forms) {
+                    EXPECT_TRUE(form.fillOffset == std::string::npos || form.fillOffset <= form.text.size());
+                }
+            }
+        }
+    }
 }
 
 } // namespace
