@@ -1,5 +1,7 @@
 #include "spreadsheet/formula/functiontable.h"
 
+#include "spreadsheet/workbook/text.h"
+
 #include <algorithm>
 #include <array>
 
@@ -29,14 +31,6 @@ constexpr std::array kFunctions {
     FunctionInfo { "YEAR", 69, 1, 1, "V" },
 };
 
-bool equalIgnoringCase(std::string_view a, std::string_view b)
-{
-    return std::equal(a.begin(), a.end(), b.begin(), b.end(), [](char x, char y) {
-        const auto upper = [](char c) { return c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c; };
-        return upper(x) == upper(y);
-    });
-}
-
 } // namespace
 
 ParameterClass FunctionInfo::parameterClass(int argument) const
@@ -55,7 +49,7 @@ std::span<const FunctionInfo> functionTable()
 const FunctionInfo* findFunction(std::string_view name)
 {
     const auto it = std::find_if(kFunctions.begin(), kFunctions.end(),
-        [&](const FunctionInfo& info) { return equalIgnoringCase(info.name, name); });
+        [&](const FunctionInfo& info) { return equalsIgnoringCase(info.name, name); });
     return it == kFunctions.end() ? nullptr : &*it;
 }
 

@@ -102,20 +102,23 @@ std::string columnLetters(int column)
     return letters;
 }
 
-Region parseAddress(std::string_view address)
+namespace {
+
+// Parses `address`, naming `shown` in the error texts.
+Region parseShownAddress(std::string_view address, std::string_view shown)
 {
     const std::size_t colon = address.find(':');
     const std::string_view firstText = address.substr(0, colon);
     const std::optional<AddressPart> first = parsePart(firstText);
     if (!first)
-        throwMalformed(address);
+        throwMalformed(shown);
 
     if (colon == std::string_view::npos) {
         // A lone cell; a lone row number or column name is not a range address.
         if (!first->column || !first->row)
-            throwMalformed(address);
+            throwMalformed(shown);
         if (!columnOnSheet(*first->column) || !rowOnSheet(*first->row))
-            throwOutside(address);
+            throwOutside(shown);
         const int row = static_cast<int>(*first->row);
         const int column = static_cast<int>(*first->column);
         return Region::cell(row, column);
@@ -124,12 +127,12 @@ Region parseAddress(std::string_view address)
     const std::optional<AddressPart> second = parsePart(address.substr(colon + 1));
     if (!second || first->column.has_value() != second->column.has_value()
         || first->row.has_value() != second->row.has_value())
-        throwMalformed(address);
+        throwMalformed(shown);
 
     Region region = Region::wholeSheet();
     if (first->column) {
         if (!columnOnSheet(*first->column) || !columnOnSheet(*second->column))
-            throwOutside(address);
+            throwOutside(shown);
         const int a = static_cast<int>(*first->column);
         const int b = static_cast<int>(*second->column);
         region.firstColumn = std::min(a, b);
@@ -137,13 +140,45 @@ Region parseAddress(std::string_view address)
     }
     if (first->row) {
         if (!rowOnSheet(*first->row) || !rowOnSheet(*second->row))
-            throwOutside(address);
+            throwOutside(shown);
         const int a = static_cast<int>(*first->row);
         const int b = static_cast<int>(*second->row);
         region.firstRow = std::min(a, b);
         region.lastRow = std::max(a, b);
     }
     return region;
+}
+
+// A lone row number or column name, which stands for that whole row or column.
+bool isLonePart(std::string_view address, bool (*isPartCharacter)(char))
+{
+    std::string_view rest = address;
+    if (!rest.empty() && rest.front() == '$')
+        rest.remove_prefix(1);
+    return !rest.empty() && std::all_of(rest.begin(), rest.end(), isPartCharacter);
+}
+
+} // namespace
+
+Region parseAddress(std::string_view address)
+{
+    return parseShownAddress(address, address);
+}
+
+Region parseRowsAddress(std::string_view address)
+{
+    const Region region = isLonePart(address, isDigit)
+        ? parseShownAddress(std::string(address) + ":" + std::string(address), address)
+        : parseAddress(address);
+    return Region::rows(region.firstRow, region.lastRow);
+}
+
+Region parseColumnsAddress(std::string_view address)
+{
+    const Region region = isLonePart(address, isLetter)
+        ? parseShownAddress(std::string(address) + ":" + std::string(address), address)
+        : parseAddress(address);
+    return Region::columns(region.firstColumn, region.lastColumn);
 }
 
 std::string formatAddress(const Region& region, AddressStyle style)

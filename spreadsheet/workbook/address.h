@@ -76,6 +76,11 @@ std::string columnLetters(int column);
 // Raises xl::Error whose text names the address when it is malformed or leaves the sheet.
 Region parseAddress(std::string_view address);
 
+// The whole rows of an address: "5", "3:5" and any cell or block address (its rows).
+Region parseRowsAddress(std::string_view address);
+// The whole columns of an address: "B", "A:C" and any cell or block address (its columns).
+Region parseColumnsAddress(std::string_view address);
+
 // "$B$4:$P$51", "$C$5", "$1:$1", "$A:$C", "$1:$65536" for the whole sheet (without the dollars
 // for AddressStyle::Relative).
 std::string formatAddress(const Region& region, AddressStyle style = AddressStyle::Absolute);

@@ -4,6 +4,7 @@
 #include "spreadsheet/formula/token.h"
 
 #include <string>
+#include <type_traits>
 #include <variant>
 
 namespace penmoor::engine {
@@ -20,5 +21,18 @@ struct Formula {
 
 // What a cell holds: nothing, a constant, or a formula.
 using CellContent = std::variant<std::monostate, double, std::string, bool, xl::ErrorValue, Formula>;
+
+// The value a cell shows: its constant, or its formula's current result.
+inline xl::Value cellValue(const CellContent& content)
+{
+    return std::visit(
+        [](const auto& held) -> xl::Value {
+            if constexpr (std::is_same_v<std::decay_t<decltype(held)>, Formula>)
+                return held.cachedValue;
+            else
+                return held;
+        },
+        content);
+}
 
 } // namespace penmoor::engine

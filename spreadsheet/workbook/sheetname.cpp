@@ -1,6 +1,7 @@
 #include "spreadsheet/workbook/sheetname.h"
 
 #include "automation/contract/error.h"
+#include "spreadsheet/workbook/text.h"
 
 #include <algorithm>
 #include <optional>
@@ -53,16 +54,11 @@ std::optional<int> utf16Length(std::string_view text)
     return units;
 }
 
-char upper(char c)
-{
-    return c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
-}
-
 } // namespace
 
 void checkSheetNameRules(std::string_view name)
 {
-    const std::string quoted = "\"" + std::string(name) + "\"";
+    const std::string quoted = std::string("\"").append(name).append("\"");
     if (name.empty())
         throw xl::Error("A sheet name cannot be empty.");
     const std::optional<int> length = utf16Length(name);
@@ -82,7 +78,7 @@ void checkSheetNameRules(std::string_view name)
 
 bool sameSheetName(std::string_view a, std::string_view b)
 {
-    return std::equal(a.begin(), a.end(), b.begin(), b.end(), [](char x, char y) { return upper(x) == upper(y); });
+    return equalsIgnoringCase(a, b);
 }
 
 } // namespace penmoor::engine

@@ -1,0 +1,378 @@
+#include "automation/contract/constants.h"
+#include "automation/contract/error.h"
+#include "spreadsheet/builtin/builtinapplication.h"
+
+#include <functional>
+
+#include <gtest/gtest.h>
+
+namespace penmoor::engine {
+namespace {
+
+std::string failure(const std::function<void()>& action)
+{
+    try {
+        action();
+    } catch (const xl::Error& error) {
+        return error.what();
+    }
+    return "no error";
+}
+
+class Builtin : public ::testing::Test {
+protected:
+    void SetUp() override
+    {
+        app = BuiltinApplicationFactory().create();
+        book = app->Workbooks()->Add();
+    }
+
+    // The builder's primitives, as select-then-act sequences.
+    void select(const std::string& address) { app->Range(address)->Select(); }
+    void setBorder(int edge, int colorIndex)
+    {
+        auto border = app->Selection()->Borders(edge);
+        border->setWeight(xl::kWeightThin);
+        border->setColorIndex(colorIndex);
+    }
+    void clearBorder(int edge) { app->Selection()->Borders(edge)->setLineStyle(xl::kLineStyleNone); }
+    void setAllBorders()
+    {
+        for (int edge = xl::kEdgeLeft; edge <= xl::kInsideHorizontal; ++edge)
+            setBorder(edge, 16);
+    }
+    int lineAt(const std::string& address, int edge) { return app->Range(address)->Borders(edge)->LineStyle(); }
+    void putCell(const std::string& address, const std::string& text)
+    {
+        select(address);
+        app->ActiveCell()->setFormulaR1C1(text);
+        app->Selection()->Merge();
+    }
+
+    std::unique_ptr<xl::Application> app;
+    std::unique_ptr<xl::Workbook> book;
+};
+
+TEST_F(Builtin, ANewWorkbookHasThreeSheetsThatTheBuildReducesToOne)
+{
+    auto sheets = app->Sheets();
+    ASSERT_EQ(sheets->count(), 3);
+    EXPECT_EQ(sheets->Item(3)->Name(), "Sheet3");
+    while (app->Sheets()->count() > 1)
+        app->Sheets()->Item(2)->Delete();
+    app->Sheets()->Item(app->Sheets()->count())->setName("CashFlow");
+    EXPECT_EQ(app->ActiveSheet()->Name(), "CashFlow");
+    EXPECT_EQ(failure([&] { app->Sheets()->Item(1)->Delete(); }),
+        "The sheet \"CashFlow\" cannot be deleted: a workbook must keep at least one sheet.");
+    EXPECT_NE(failure([&] { app->Sheets()->Item(2); }).find("has no sheet 2"), std::string::npos);
+    EXPECT_NE(failure([&] { app->Sheets()->Item(1)->setName("Cash/Flow"); }).find("cannot contain"), std::string::npos);
+}
+
+TEST_F(Builtin, HoldsItsSwitchesAndRefusesUnknownValues)
+{
+    app->setVisible(false);
+    app->setScreenUpdating(false);
+    app->setDisplayAlerts(false);
+    app->setEnableEvents(false);
+    app->setEnableCancelKey(xl::kCancelKeyDisabled);
+    app->setCursor(xl::kCursorWait);
+    EXPECT_FALSE(app->ScreenUpdating());
+    EXPECT_FALSE(app->DisplayAlerts());
+    EXPECT_FALSE(app->EnableEvents());
+    EXPECT_EQ(app->EnableCancelKey(), xl::kCancelKeyDisabled);
+    EXPECT_EQ(app->Cursor(), xl::kCursorWait);
+    EXPECT_DOUBLE_EQ(app->InchesToPoints(0.7), 50.4);
+    EXPECT_NE(failure([&] { app->setCursor(99); }), "no error");
+    EXPECT_NE(failure([&] { app->setEnableCancelKey(3); }), "no error");
+}
+
+TEST_F(Builtin, ObjectsFailCleanlyOnceTheirWorkbookOrApplicationIsGone)
+{
+    auto range = app->Range("C5");
+    auto sheet = app->Sheets()->Item(2);
+    sheet->Delete();
+    EXPECT_NE(failure([&] { sheet->Name(); }).find("has been deleted"), std::string::npos);
+
+    book->Close();
+    EXPECT_EQ(failure([&] { range->setFormulaR1C1("1"); }),
+        "The workbook \"Book1\" has been closed; its objects can no longer be used.");
+    EXPECT_EQ(failure([&] { app->Range("A1"); }), "No workbook is open in the spreadsheet application.");
+    EXPECT_EQ(app->Workbooks()->count(), 0);
+
+    auto second = app->Workbooks()->Add();
+    auto font = app->Range("A1")->Font();
+    app->Quit();
+    const std::string gone = "The spreadsheet application has quit; its objects can no longer be used.";
+    EXPECT_EQ(failure([&] { font->setName("Arial"); }), gone);
+    EXPECT_EQ(failure([&] { second->Colors(1); }), gone);
+    EXPECT_EQ(failure([&] { app->Visible(); }), gone);
+    EXPECT_EQ(failure([&] { app->Quit(); }), gone);
+}
+
+TEST_F(Builtin, ThereIsNeverARunningInstanceToAttachTo)
+{
+    BuiltinApplicationFactory factory;
+    EXPECT_THROW(factory.attachRunning(), xl::Error);
+    EXPECT_NE(factory.create(), nullptr);
+}
+
+TEST_F(Builtin, SelectMovesTheSelectionAndTheActiveCell)
+{
+    select("b4:p51");
+    EXPECT_EQ(app->Selection()->Address(), "$B$4:$P$51");
+    EXPECT_EQ(app->ActiveCell()->Address(), "$B$4");
+    app->Rows("8:8")->Select();
+    EXPECT_EQ(app->Selection()->Address(), "$8:$8");
+    EXPECT_EQ(app->Selection()->count(), 256);
+    app->Columns("C")->Select();
+    EXPECT_EQ(app->ActiveCell()->Address(), "$C$1");
+    app->Cells()->Select();
+    EXPECT_EQ(app->Selection()->Address(), "$1:$65536");
+
+    // Only ranges of the active sheet can be selected.
+    auto other = app->Sheets()->Item(2);
+    auto otherRange = other->UsedRange();
+    EXPECT_NE(failure([&] { otherRange->Select(); }).find("is not the active sheet"), std::string::npos);
+    other->Select();
+    otherRange->Select();
+    EXPECT_EQ(app->ActiveSheet()->Name(), "Sheet2");
+}
+
+TEST_F(Builtin, AddressesOutsideTheSheetAreRejectedByName)
+{
+    EXPECT_EQ(failure([&] { app->Range("IW1"); }),
+        "The address \"IW1\" is outside the sheet (columns A to IV, rows 1 to 65536).");
+    EXPECT_EQ(failure([&] { app->Rows("65537"); }),
+        "The address \"65537\" is outside the sheet (columns A to IV, rows 1 to 65536).");
+    EXPECT_NE(failure([&] { app->Columns("A1B"); }).find("\"A1B\" is not a valid"), std::string::npos);
+    EXPECT_EQ(app->Rows("3")->Address(), "$3:$3");
+    EXPECT_EQ(app->Range("A1:B2")->Item(5)->Address(), "$A$3");
+    EXPECT_EQ(app->Range("A1:B2")->Rows()->Item(2)->count(), 1);
+    EXPECT_EQ(app->Columns("B2:C9")->Address(), "$B:$C");
+}
+
+TEST_F(Builtin, TheTableFrameOfTheCashFlowSheet)
+{
+    app->Cells()->Select();
+    app->Cells()->Clear();
+    app->Selection()->Font()->setName("Arial");
+    app->Selection()->Interior()->setColorIndex(2);
+
+    select("B4:P51");
+    setAllBorders();
+    app->Selection()->setVerticalAlignment(xl::kAlignCenter);
+    select("B4");
+    clearBorder(xl::kEdgeTop);
+    clearBorder(xl::kEdgeLeft);
+    select("C5:P53");
+    app->Selection()->setNumberFormat("#,##0");
+
+    EXPECT_EQ(lineAt("B4", xl::kEdgeTop), xl::kLineStyleNone);
+    EXPECT_EQ(lineAt("B4", xl::kEdgeLeft), xl::kLineStyleNone);
+    EXPECT_EQ(lineAt("C4", xl::kEdgeTop), xl::kLineStyleContinuous);
+    EXPECT_EQ(lineAt("B5", xl::kEdgeLeft), xl::kLineStyleContinuous);
+    EXPECT_EQ(lineAt("P51", xl::kEdgeBottom), xl::kLineStyleContinuous);
+    EXPECT_EQ(lineAt("P52", xl::kEdgeTop), xl::kLineStyleContinuous); // the line under P51
+    EXPECT_EQ(lineAt("Q20", xl::kEdgeLeft), xl::kLineStyleContinuous);
+    EXPECT_EQ(lineAt("Q20", xl::kEdgeRight), xl::kLineStyleNone);
+    EXPECT_EQ(app->Range("C4")->Borders(xl::kEdgeTop)->ColorIndex(), 16);
+    EXPECT_EQ(app->Range("C4")->Borders(xl::kEdgeTop)->Weight(), xl::kWeightThin);
+    EXPECT_EQ(app->Range("B4")->Borders(xl::kEdgeTop)->ColorIndex(), xl::kColorIndexNone);
+    EXPECT_EQ(app->Range("B4:C5")->Borders(xl::kInsideVertical)->LineStyle(), xl::kLineStyleContinuous);
+    EXPECT_EQ(app->Range("C53")->NumberFormat(), "#,##0");
+    EXPECT_EQ(app->Range("C54")->NumberFormat(), "General");
+    EXPECT_EQ(app->Range("P51")->VerticalAlignment(), xl::kAlignCenter);
+
+    // A spacer row loses its left, right and inner vertical lines, and nothing else.
+    app->Rows("20:20")->Select();
+    app->Selection()->setRowHeight(8);
+    clearBorder(xl::kEdgeLeft);
+    clearBorder(xl::kEdgeRight);
+    clearBorder(xl::kInsideVertical);
+    EXPECT_EQ(lineAt("B20", xl::kEdgeLeft), xl::kLineStyleNone);
+    EXPECT_EQ(lineAt("H20", xl::kEdgeRight), xl::kLineStyleNone);
+    EXPECT_EQ(lineAt("H20", xl::kEdgeTop), xl::kLineStyleContinuous);
+    EXPECT_EQ(lineAt("H21", xl::kEdgeLeft), xl::kLineStyleContinuous);
+    EXPECT_EQ(app->Range("H20")->RowHeight(), 8.0);
+
+    // Cells never touched show the whole-sheet format.
+    EXPECT_EQ(app->Range("Z1000")->Interior()->ColorIndex(), 2);
+    EXPECT_EQ(app->Range("IV65536")->Font()->Name(), "Arial");
+
+    EXPECT_EQ(app->ActiveSheet()->UsedRange()->Address(), "$B$4:$P$53");
+    // With the widths of A to P and the heights of rows 1 to 4 set, it starts at A1.
+    for (int column = 1; column <= 16; ++column) {
+        const std::string letter(1, static_cast<char>('A' + column - 1));
+        app->Columns(letter + ":" + letter)->Select();
+        app->Selection()->setColumnWidth(column == 1 ? 1 : 8.33);
+    }
+    app->Rows("1:1")->Select();
+    app->Selection()->setRowHeight(11.25);
+    auto used = app->ActiveSheet()->UsedRange();
+    EXPECT_EQ(used->Address(), "$A$1:$P$53");
+    auto rows = used->Rows();
+    EXPECT_EQ(rows->count(), 53);
+    EXPECT_EQ(rows->Item(rows->count())->Row(), 53);
+    EXPECT_EQ(used->Columns()->Item(used->Columns()->count())->Column(), 16);
+    EXPECT_EQ(app->Range("A1")->ColumnWidth(), 1.0);
+    EXPECT_EQ(app->Range("Q1")->ColumnWidth(), 8.43);
+}
+
+TEST_F(Builtin, FormatsOfWholeRowsAndColumnsReachCellsCreatedLater)
+{
+    app->Columns("D:D")->Select();
+    app->Selection()->Interior()->setColorIndex(43);
+    app->Rows("6:6")->Select();
+    app->Selection()->Font()->setFontStyle("Bold");
+    app->Selection()->Font()->setSize(9);
+
+    // Where they meet, the cell has both.
+    EXPECT_EQ(app->Range("D6")->Font()->FontStyle(), "Bold");
+    EXPECT_EQ(app->Range("D6")->Interior()->ColorIndex(), 43);
+    EXPECT_EQ(app->Range("D7")->Interior()->ColorIndex(), 43);
+    EXPECT_EQ(app->Range("X6")->Font()->Size(), 9.0);
+    EXPECT_EQ(app->Range("X7")->Font()->FontStyle(), "Regular");
+
+    app->Range("D7")->setFormulaR1C1("5");
+    EXPECT_EQ(app->Range("D7")->Interior()->ColorIndex(), 43);
+    EXPECT_EQ(failure([&] { app->Selection()->Font()->setFontStyle("Heavy"); }),
+        "The font style \"Heavy\" is not one of Regular, Bold, Italic and Bold Italic.");
+}
+
+TEST_F(Builtin, CellEntryFollowsTheApplicationsRules)
+{
+    putCell("P2", "1/1/2013");
+    EXPECT_EQ(app->Range("P2")->Value(), xl::Value(41275.0));
+    EXPECT_EQ(app->Range("P2")->NumberFormat(), "m/d/yyyy");
+    app->Selection()->setNumberFormat("mmm-yy");
+    EXPECT_EQ(app->Range("P2")->FormulaR1C1(), "1/1/2013");
+
+    putCell("D4", "=R[-2]C[12]");
+    EXPECT_EQ(app->Range("D4")->Value(), xl::Value(41275.0));
+    putCell("E4", "=DATE(YEAR(RC[-1]),MONTH(RC[-1])+1,1)");
+    EXPECT_EQ(app->Range("E4")->Value(), xl::Value(41306.0));
+    EXPECT_EQ(app->Range("E4")->FormulaR1C1(), "=DATE(YEAR(RC[-1]),MONTH(RC[-1])+1,1)");
+
+    putCell("C7", "2013");
+    putCell("C8", "=R[-1]C[0]+1");
+    EXPECT_EQ(app->Range("C8")->Value(), xl::Value(2014.0));
+    EXPECT_EQ(app->Range("C8")->FormulaR1C1(), "=R[-1]C+1");
+    putCell("C7", "'2013");
+    EXPECT_EQ(app->Range("C8")->Value(), xl::Value(2014.0)); // text that reads as a number
+    putCell("C7", "Week 1");
+    EXPECT_EQ(app->Range("C8")->Value(), xl::Value(xl::ErrorValue::Value));
+
+    putCell("C9", "10%");
+    EXPECT_EQ(app->Range("C9")->NumberFormat(), "0%");
+    EXPECT_EQ(app->Range("C9")->FormulaR1C1(), "10%");
+
+    // Labels are kept as they stand.
+    for (const char* label : { "=1+1", "1-2", "10%", "2013", "'quoted" }) {
+        app->Range("B10")->setLiteralText(label);
+        EXPECT_EQ(app->Range("B10")->Value(), xl::Value(std::string(label)));
+    }
+    EXPECT_EQ(failure([&] { app->Range("B11")->setFormulaR1C1("=SUM(R1C1"); }),
+        "The formula \"=SUM(R1C1\" is not valid: the call of SUM is never closed.");
+    EXPECT_EQ(app->Range("B11")->Value(), xl::Value());
+}
+
+TEST_F(Builtin, EnteringIntoABlockFillsEachCellWithRelativeFormulas)
+{
+    app->Range("A1:A3")->setFormulaR1C1("2");
+    app->Range("B1:B3")->setFormulaR1C1("=RC[-1]*10");
+    EXPECT_EQ(app->Range("B3")->Value(), xl::Value(20.0));
+    EXPECT_NE(failure([&] { app->Range("A:Q")->setFormulaR1C1("1"); }), "no error");
+    app->Range("B1:B3")->Clear();
+    EXPECT_EQ(app->Range("B2")->FormulaR1C1(), "");
+}
+
+TEST_F(Builtin, PropertiesRejectValuesOutsideTheirRanges)
+{
+    const std::pair<std::function<void()>, const char*> cases[] = {
+        { [&] { app->Range("A1")->setRowHeight(410); }, "The row height 410 is not valid" },
+        { [&] { app->Range("A1")->setColumnWidth(-1); }, "The column width -1 is not valid" },
+        { [&] { app->Range("A1")->Borders(5); }, "The border index 5 is not supported." },
+        { [&] { app->Range("A1")->Borders(7)->setWeight(3); }, "The border weight 3 is not supported." },
+        { [&] { app->Range("A1")->Borders(7)->setLineStyle(-4115); }, "line style -4115 is not supported" },
+        { [&] { app->Range("A1")->Interior()->setColorIndex(57); }, "fill colour index 57" },
+        { [&] { app->Range("A1")->Font()->setColorIndex(0); }, "font colour index 0" },
+        { [&] { app->Range("A1")->Font()->setSize(0); }, "font size" },
+        { [&] { app->Range("A1")->setHorizontalAlignment(5); }, "horizontal alignment 5" },
+        { [&] { app->Range("A1")->Item(0); }, "has no item 0" },
+        { [&] { app->Range("A65536")->Item(2); }, "has no item 2" },
+        { [&] { app->Range("A65536:B65536")->Item(3); }, "has no item 3" },
+        { [&] { book->Colors(57); }, "The colour index 57 is outside the palette (1 to 56)." },
+        { [&] { book->SaveAs("out.xls"); }, "saving .xls files is not available" },
+        { [&] { app->Workbooks()->Open("in.xls"); }, "opening .xls files is not available" },
+        { [&] { app->Range("A1")->CopyPicture(); }, "no sheet pictures" },
+        { [&] { app->ActiveSheet()->PageSetup()->setZoom(5); }, "zoom of 5%" },
+        { [&] { app->ActiveSheet()->PageSetup()->setOrientation(3); }, "page orientation 3" },
+        { [&] { app->ActiveSheet()->PageSetup()->setPrintArea("A1:IW2"); }, "\"A1:IW2\" is outside the sheet" },
+        { [&] { app->ActiveSheet()->PageSetup()->setLeftMargin(-1); }, "left margin of -1 points" },
+    };
+    for (const auto& [action, message] : cases)
+        EXPECT_NE(failure(action).find(message), std::string::npos) << message << ": " << failure(action);
+}
+
+TEST_F(Builtin, PageSetupIsHeldAndReadBack)
+{
+    auto page = app->ActiveSheet()->PageSetup();
+    EXPECT_EQ(page->PrintArea(), "");
+    EXPECT_EQ(page->Zoom(), 100);
+    page->setPrintArea("a1:p53");
+    app->ActiveSheet()->PageSetup()->setLeftMargin(app->InchesToPoints(0.7));
+    page->setTopMargin(app->InchesToPoints(0.5));
+    page->setHeaderMargin(0);
+    page->setPrintComments(xl::kPrintNoComments);
+    page->setOrientation(xl::kOrientationLandscape);
+    page->setPaperSize(xl::kPaperA4);
+    page->setZoom(std::nullopt);
+    page->setFitToPagesWide(1);
+    page->setFitToPagesTall(1);
+
+    auto again = app->ActiveSheet()->PageSetup();
+    EXPECT_EQ(again->PrintArea(), "$A$1:$P$53");
+    EXPECT_DOUBLE_EQ(again->LeftMargin(), 50.4);
+    EXPECT_DOUBLE_EQ(again->TopMargin(), 36.0);
+    EXPECT_DOUBLE_EQ(again->HeaderMargin(), 0.0);
+    EXPECT_EQ(again->Orientation(), xl::kOrientationLandscape);
+    EXPECT_EQ(again->PaperSize(), xl::kPaperA4);
+    EXPECT_EQ(again->Zoom(), std::nullopt);
+    EXPECT_EQ(again->FitToPagesTall(), 1);
+    EXPECT_EQ(again->PrintComments(), xl::kPrintNoComments);
+}
+
+TEST_F(Builtin, PaletteEntriesAreWritableThroughTheWorkbook)
+{
+    book->setColors(12, 0x5F5237);
+    EXPECT_EQ(app->ActiveWorkbook()->Colors(12), 0x5F5237u);
+    EXPECT_EQ(app->Workbooks()->Item(1)->Colors(2), 0xFFFFFFu);
+}
+
+// Hands back a picture whose size tells what was asked, and what D1 showed when it was asked.
+class RecordingRenderer : public PictureRenderer {
+public:
+    xl::Picture renderPicture(const Workbook&, const Sheet& sheet, const Region& block) override
+    {
+        const CellContent* content = sheet.content({ 1, 4 });
+        shownValue = content ? std::get<Formula>(*content).cachedValue : xl::Value();
+        return { block.columnCount(), block.rowCount(), std::vector<std::uint32_t>(block.cellCount(), 0xFFFFFFFF) };
+    }
+    xl::Value shownValue;
+};
+
+TEST(BuiltinPicture, CopyPictureHandsTheRangeToTheRendererWithCurrentResults)
+{
+    auto renderer = std::make_shared<RecordingRenderer>();
+    auto app = BuiltinApplicationFactory(renderer).create();
+    app->Workbooks()->Add();
+    app->Range("A1")->setFormulaR1C1("2");
+    app->Range("D1")->setFormulaR1C1("=RC[-3]*21");
+    const xl::Picture picture = app->Range("A1:D3")->CopyPicture();
+    EXPECT_EQ(picture.width, 4);
+    EXPECT_EQ(picture.height, 3);
+    EXPECT_EQ(renderer->shownValue, xl::Value(42.0));
+}
+
+} // namespace
+} // namespace penmoor::engine
