@@ -5,6 +5,7 @@
 #include <cstring>
 
 #include <QBuffer>
+#include <QGuiApplication>
 #include <QPainter>
 #include <QString>
 
@@ -49,10 +50,19 @@ QRect toQRect(const PixelRect& rect)
     return QRect(rect.left, rect.top, rect.width(), rect.height());
 }
 
+// Fonts and their metrics need the application object; fail with a clear error instead.
+void requireGuiApplication()
+{
+    if (!QGuiApplication::instance()) {
+        throw xl::Error("The sheet picture cannot be drawn: the program's graphics services are not running.");
+    }
+}
+
 } // namespace
 
 QImage paintLayout(const PictureLayout& layout, const QtTextMetrics& metrics)
 {
+    requireGuiApplication();
     QImage image(std::max(layout.width, 1), std::max(layout.height, 1), QImage::Format_RGB32);
     if (image.isNull()) {
         throw xl::Error("There is not enough memory for a picture of the sheet.");
@@ -86,6 +96,7 @@ QImage paintLayout(const PictureLayout& layout, const QtTextMetrics& metrics)
 
 xl::Picture paintSheetRegion(const SheetRegion& region)
 {
+    requireGuiApplication();
     const QtTextMetrics metrics;
     return toPicture(paintLayout(layOutPicture(region, metrics), metrics));
 }

@@ -13,8 +13,8 @@
 namespace penmoor::picture {
 
 // Paints a laid-out picture onto a white 96-dpi image with the fonts the metrics measured.
-// Needs a QGuiApplication (the offscreen platform serves). Raises xl::Error when the image
-// cannot be allocated.
+// Needs a QGuiApplication (the offscreen platform serves); raises xl::Error without one, or when
+// the image cannot be allocated.
 QImage paintLayout(const PictureLayout& layout, const QtTextMetrics& metrics);
 
 // Lays out and paints a block of a sheet in one go.

@@ -1,5 +1,6 @@
 #include "automation/contract/error.h"
 #include "spreadsheet/picture/bmpfile.h"
+#include "spreadsheet/picture/enginepicturerenderer.h"
 #include "spreadsheet/picture/sheetpainter.h"
 
 #include <gtest/gtest.h>
@@ -180,6 +181,25 @@ TEST_F(PaintTest, PngAndBitmapFilesReadBackAsPainted)
         EXPECT_EQ(loaded.convertToFormat(QImage::Format_RGB32), painted.convertToFormat(QImage::Format_RGB32)) << name;
     }
     EXPECT_THROW(encodePng(xl::Picture {}), xl::Error);
+}
+
+TEST_F(PaintTest, RendererPaintsTheBlockOfAWorkbookSheet)
+{
+    engine::Workbook workbook;
+    engine::Sheet& sheet = workbook.addSheet("CashFlow");
+    sheet.setColumnWidth(2, 32.0);
+    sheet.setRowHeight(2, 27.75);
+    engine::CellStyle shaded;
+    shaded.fillColorIndex = 55;
+    sheet.setCellStyle({ 2, 2 }, workbook.styles().intern(shaded));
+
+    EnginePictureRenderer renderer;
+    const xl::Picture picture = renderer.renderPicture(workbook, sheet, { 1, 1, 2, 2 });
+    EXPECT_EQ(picture.width, 64 + 229 + 1);
+    EXPECT_EQ(picture.height, 17 + 37 + 1);
+    const QImage image = toImage(picture);
+    EXPECT_EQ(image.pixel(64 + 114, 17 + 18) & 0xFFFFFF, paletteRgb(workbook.palette()[54]));
+    EXPECT_EQ(image.pixel(32, 8) & 0xFFFFFF, kPageColor);
 }
 
 } // namespace
