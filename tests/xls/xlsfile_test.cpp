@@ -1,0 +1,127 @@
+// Saving and opening files: the new file replaces the old one only when complete, failures
+// leave nothing behind and say why, and unreadable content is named as such.
+#include "automation/contract/error.h"
+#include "spreadsheet/xls/xlsfile.h"
+#include "spreadsheet/xls/xlswriter.h"
+#include "tests/xls/support/sampleworkbooks.h"
+#include "tests/xls/support/tempdir.h"
+#include "tests/xls/support/workbookcompare.h"
+
+#include <fstream>
+#include <functional>
+
+#include <gtest/gtest.h>
+
+namespace penmoor::xls {
+namespace {
+
+using namespace engine;
+
+std::string utf8(const std::filesystem::path& path)
+{
+    const std::u8string text = path.u8string();
+    return { text.begin(), text.end() };
+}
+
+void writeText(const std::filesystem::path& path, const std::string& text)
+{
+    std::ofstream(path, std::ios::binary) << text;
+}
+
+std::string readText(const std::filesystem::path& path)
+{
+    std::ifstream in(path, std::ios::binary);
+    return { std::istreambuf_iterator<char>(in), {} };
+}
+
+std::vector<std::string> folderContents(const std::filesystem::path& folder)
+{
+    std::vector<std::string> names;
+    for (const auto& entry : std::filesystem::directory_iterator(folder))
+        names.push_back(utf8(entry.path().filename()));
+    std::sort(names.begin(), names.end());
+    return names;
+}
+
+// The xl::Error text of a call, or "" when it succeeds.
+std::string failure(const std::function<void()>& call)
+{
+    try {
+        call();
+    } catch (const xl::Error& error) {
+        return error.what();
+    }
+    return "";
+}
+
+TEST(XlsFile, SavesAndOpensUnderAnyName)
+{
+    test::TempDir folder;
+    const auto path = utf8(folder.file("Überschuss 現金 2013.xls"));
+    const Workbook book = test::cashFlowSample();
+    saveXlsFile(book, path);
+    EXPECT_EQ(folderContents(folder.path()), std::vector<std::string> { "Überschuss 現金 2013.xls" });
+    EXPECT_EQ(test::workbookDifferences(book, openXlsFile(path)), "");
+    EXPECT_EQ(readText(folder.file("Überschuss 現金 2013.xls")).size(), writeXls(book).size());
+}
+
+TEST(XlsFile, ReplacesAnExistingFileWhole)
+{
+    test::TempDir folder;
+    const auto path = folder.file("plan.xls");
+    writeText(path, std::string(100000, 'x'));
+    saveXlsFile(test::cashFlowSample(), utf8(path));
+    const auto bytes = writeXls(test::cashFlowSample());
+    EXPECT_EQ(readText(path), std::string(bytes.begin(), bytes.end()));
+    EXPECT_EQ(folderContents(folder.path()), std::vector<std::string> { "plan.xls" });
+}
+
+TEST(XlsFile, FailedSavesLeaveNothingBehindAndSayWhy)
+{
+    test::TempDir folder;
+    const Workbook book = test::cashFlowSample();
+
+    const auto missing = utf8(folder.file("no such folder") / "plan.xls");
+    EXPECT_EQ(failure([&] { saveXlsFile(book, missing); }),
+        "The workbook cannot be saved as \"" + missing + "\": No such file or directory.");
+
+    // A folder where the file should go: the new workbook cannot take its place.
+    std::filesystem::create_directory(folder.file("taken.xls"));
+    const auto taken = utf8(folder.file("taken.xls"));
+    EXPECT_NE(
+        failure([&] { saveXlsFile(book, taken); }).find("cannot be saved as \"" + taken + "\": "), std::string::npos);
+    EXPECT_TRUE(std::filesystem::is_directory(folder.file("taken.xls")));
+
+    // A workbook the format cannot hold leaves the existing file as it was.
+    const auto kept = folder.file("kept.xls");
+    writeText(kept, "the old workbook");
+    Workbook tooLong;
+    tooLong.addSheet("S").setContent({ 1, 1 }, std::string(40000, 'x'));
+    EXPECT_NE(failure([&] { saveXlsFile(tooLong, utf8(kept)); }).find("A1 is longer than 32767 characters"),
+        std::string::npos);
+    EXPECT_EQ(readText(kept), "the old workbook");
+
+    EXPECT_EQ(folderContents(folder.path()), (std::vector<std::string> { "kept.xls", "taken.xls" }));
+}
+
+TEST(XlsFile, OpenSaysWhyItCannot)
+{
+    test::TempDir folder;
+    const auto missing = utf8(folder.file("missing.xls"));
+    EXPECT_EQ(failure([&] { openXlsFile(missing); }),
+        "The workbook \"" + missing + "\" cannot be opened: No such file or directory.");
+
+    const auto text = folder.file("notes.xls");
+    writeText(text, std::string(2000, 'n'));
+    EXPECT_EQ(failure([&] { openXlsFile(utf8(text)); }),
+        utf8(text) + " is not a readable .xls workbook: the file does not start with the compound file signature.");
+
+    const auto cut = folder.file("cut.xls");
+    const auto bytes = writeXls(test::cashFlowSample());
+    writeText(cut, std::string(bytes.begin(), bytes.begin() + 3000));
+    EXPECT_NE(failure([&] { openXlsFile(utf8(cut)); }).find(utf8(cut) + " is not a readable .xls workbook: "),
+        std::string::npos);
+}
+
+} // namespace
+} // namespace penmoor::xls
