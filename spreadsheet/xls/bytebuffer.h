@@ -44,6 +44,9 @@ public:
             std::memset(grow(count), 0, count);
     }
 
+    // Drops the bytes from `size` on, keeping the capacity.
+    void truncate(std::size_t size) { m_size = std::min(size, m_size); }
+
     // Overwrites bytes already written (record lengths and offsets known only later).
     void patchU16(std::size_t offset, std::uint16_t value) { store(m_bytes.data() + offset, value); }
     void patchU32(std::size_t offset, std::uint32_t value) { store(m_bytes.data() + offset, value); }

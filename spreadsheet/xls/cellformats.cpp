@@ -109,31 +109,12 @@ std::uint8_t edgeColourIcv(std::uint8_t colorIndex)
                                          : static_cast<std::uint8_t>(colorIndex + 7);
 }
 
-CellFormatTable::CellFormatTable(const Workbook& workbook)
-    : m_xfOfStyle(workbook.styles().size(), kUnused)
-    , m_styles(workbook.styles())
+CellFormatTable::CellFormatTable(const StyleTable& styles)
+    : m_xfOfStyle(styles.size(), kUnused)
+    , m_styles(styles)
 {
     // The default format is the default cell XF itself.
     m_xfOfStyle[kDefaultStyleId] = kDefaultCellXf;
-    std::vector<CellSpan> spans;
-    for (int index = 0; index < workbook.sheetCount(); ++index) {
-        const Sheet& sheet = workbook.sheet(index);
-        use(sheet.sheetStyle());
-        for (int column = 1; column <= kMaxColumns; ++column) {
-            if (const auto style = sheet.columnStyle(column))
-                use(*style);
-        }
-        for (int row = 1; row <= sheet.lastStoredRow(); ++row) {
-            const RowData* data = sheet.rowData(row);
-            if (!data)
-                continue;
-            if (data->style)
-                use(*data->style);
-            sheet.cellSpans(row, spans);
-            for (const CellSpan& span : spans)
-                use(span.style);
-        }
-    }
 }
 
 void CellFormatTable::use(StyleId style)

@@ -11,21 +11,22 @@
 namespace penmoor::xls {
 
 // The workbook's formats as the file keeps them: fonts, number formats and one cell XF per
-// format the sheets use, shared by every cell, row and column with that format. Built from a
-// scan of the workbook, so formats the model keeps but no sheet uses are left out.
+// format the sheets use, shared by every cell, row and column with that format. Formats the
+// model keeps but no sheet uses are left out: the writer announces each one it meets.
 class CellFormatTable {
 public:
-    // Raises WriteError when the sheets use more formats or fonts than the file can hold.
-    explicit CellFormatTable(const engine::Workbook& workbook);
+    explicit CellFormatTable(const engine::StyleTable& styles);
 
-    // The XF of a format that the sheets use.
+    // Gives a format its XF on first use. Raises WriteError when the sheets use more formats
+    // or fonts than the file can hold.
+    void use(engine::StyleId style);
+    // The XF of a format announced with use().
     std::uint16_t xf(engine::StyleId style) const { return m_xfOfStyle[style]; }
 
     // FONT, FORMAT, XF and STYLE records, in the order the globals need them.
     void write(RecordWriter& writer) const;
 
 private:
-    void use(engine::StyleId style);
     void addXf(const engine::CellStyle& style, engine::StyleId id);
     std::uint16_t fontIndex(const engine::Font& font);
     std::uint16_t formatIndex(const std::string& text);

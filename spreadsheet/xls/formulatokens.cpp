@@ -88,48 +88,6 @@ std::string cellName(CellPosition cell)
     return columnLetters(cell.column) + std::to_string(cell.row);
 }
 
-// Marks which reference tokens feed a parameter that takes references, by replaying the
-// postfix array on a stack of the tokens that produced each operand.
-std::vector<bool> referenceOperands(const TokenArray& tokens, CellPosition cell)
-{
-    constexpr std::size_t kComputed = static_cast<std::size_t>(-1);
-    std::vector<bool> byReference(tokens.size(), false);
-    std::vector<std::size_t> roots;
-    auto pop = [&]() {
-        if (roots.empty())
-            throw WriteError("the formula in " + cellName(cell) + " is malformed");
-        const std::size_t root = roots.back();
-        roots.pop_back();
-        return root;
-    };
-    for (std::size_t i = 0; i < tokens.size(); ++i) {
-        const Token& token = tokens[i];
-        if (const auto* op = std::get_if<OperatorToken>(&token)) {
-            pop();
-            if (!isUnary(op->op))
-                pop();
-            roots.push_back(kComputed);
-        } else if (std::holds_alternative<ParenthesisToken>(token)) {
-            roots.push_back(pop());
-        } else if (const auto* call = std::get_if<FunctionToken>(&token)) {
-            const FunctionInfo* info = findFunction(call->functionIndex);
-            for (int argument = call->argumentCount - 1; argument >= 0; --argument) {
-                const std::size_t root = pop();
-                if (info && root != kComputed && info->parameterClass(argument) == ParameterClass::Reference)
-                    byReference[root] = true;
-            }
-            roots.push_back(kComputed);
-        } else if (std::holds_alternative<ReferenceToken>(token) || std::holds_alternative<AreaToken>(token)) {
-            roots.push_back(i);
-        } else {
-            roots.push_back(kComputed);
-        }
-    }
-    if (roots.size() != 1 && !tokens.empty())
-        throw WriteError("the formula in " + cellName(cell) + " is malformed");
-    return byReference;
-}
-
 struct FileReference {
     bool onSheet = true;
     std::uint16_t row = 0;
@@ -422,15 +380,66 @@ private:
 
 } // namespace
 
-std::optional<std::vector<std::uint8_t>> encodeFormula(const TokenArray& tokens, CellPosition cell)
+// Marks which reference tokens feed a parameter that takes references, by replaying the
+// postfix array on a stack of the tokens that produced each operand.
+void FormulaEncoder::markReferenceOperands(const TokenArray& tokens, CellPosition cell)
 {
-    const std::vector<bool> byReference = referenceOperands(tokens, cell);
-    ByteBuffer out;
+    constexpr std::size_t kComputed = static_cast<std::size_t>(-1);
+    m_byReference.assign(tokens.size(), false);
+    m_roots.clear();
+    auto pop = [&]() {
+        if (m_roots.empty())
+            throw WriteError("the formula in " + cellName(cell) + " is malformed");
+        const std::size_t root = m_roots.back();
+        m_roots.pop_back();
+        return root;
+    };
+    for (std::size_t i = 0; i < tokens.size(); ++i) {
+        const Token& token = tokens[i];
+        if (const auto* op = std::get_if<OperatorToken>(&token)) {
+            pop();
+            if (!isUnary(op->op))
+                pop();
+            m_roots.push_back(kComputed);
+        } else if (std::holds_alternative<ParenthesisToken>(token)) {
+            m_roots.push_back(pop());
+        } else if (const auto* call = std::get_if<FunctionToken>(&token)) {
+            const FunctionInfo* info = findFunction(call->functionIndex);
+            for (int argument = call->argumentCount - 1; argument >= 0; --argument) {
+                const std::size_t root = pop();
+                if (info && root != kComputed && info->parameterClass(argument) == ParameterClass::Reference)
+                    m_byReference[root] = true;
+            }
+            m_roots.push_back(kComputed);
+        } else if (std::holds_alternative<ReferenceToken>(token) || std::holds_alternative<AreaToken>(token)) {
+            m_roots.push_back(i);
+        } else {
+            m_roots.push_back(kComputed);
+        }
+    }
+    if (m_roots.size() != 1 && !tokens.empty())
+        throw WriteError("the formula in " + cellName(cell) + " is malformed");
+}
+
+bool FormulaEncoder::encode(const TokenArray& tokens, CellPosition cell, ByteBuffer& out)
+{
+    markReferenceOperands(tokens, cell);
+    const std::size_t start = out.size();
     Encoder encoder(cell, out);
     for (std::size_t i = 0; i < tokens.size(); ++i) {
-        if (!encoder.write(tokens[i], byReference[i]))
-            return std::nullopt;
+        if (!encoder.write(tokens[i], m_byReference[i])) {
+            out.truncate(start);
+            return false;
+        }
     }
+    return true;
+}
+
+std::optional<std::vector<std::uint8_t>> encodeFormula(const TokenArray& tokens, CellPosition cell)
+{
+    ByteBuffer out;
+    if (!FormulaEncoder().encode(tokens, cell, out))
+        return std::nullopt;
     return out.take();
 }
 

@@ -2,6 +2,7 @@
 
 #include "spreadsheet/formula/token.h"
 #include "spreadsheet/workbook/address.h"
+#include "spreadsheet/xls/bytebuffer.h"
 
 #include <cstdint>
 #include <optional>
@@ -15,9 +16,24 @@ namespace penmoor::xls {
 // bits set; a target off the sheet becomes a reference error. Operands of functions that take
 // references get the reference class, every other operand the value class.
 
-// The token bytes, or nothing when the formula calls a function or names something the file
-// cannot express without an external name table (it then evaluates to #NAME? anyway).
-// Raises WriteError for a text constant over 255 characters or a malformed token array.
+// Encodes formula after formula, keeping its working storage, so that a sheet of formulas is
+// written without an allocation per cell.
+class FormulaEncoder {
+public:
+    // Appends the token bytes to `out`. Returns false, with `out` as it was, when the formula
+    // calls a function or names something the file cannot express without an external name
+    // table (it then evaluates to #NAME? anyway). Raises WriteError for a text constant over
+    // 255 characters or a malformed token array.
+    bool encode(const engine::TokenArray& tokens, engine::CellPosition cell, ByteBuffer& out);
+
+private:
+    void markReferenceOperands(const engine::TokenArray& tokens, engine::CellPosition cell);
+
+    std::vector<std::size_t> m_roots;
+    std::vector<bool> m_byReference;
+};
+
+// The token bytes of one formula, as FormulaEncoder gives them.
 std::optional<std::vector<std::uint8_t>> encodeFormula(const engine::TokenArray& tokens, engine::CellPosition cell);
 
 // The model's tokens for these bytes, or nothing when they use something the model does not

@@ -12,10 +12,12 @@ namespace penmoor::xls {
 std::uint32_t SharedStrings::add(std::string_view text)
 {
     ++m_total;
-    auto [it, added] = m_index.try_emplace(std::string(text), static_cast<std::uint32_t>(m_strings.size()));
-    if (added)
-        m_strings.push_back(utf8ToUtf16(text));
-    return it->second;
+    if (const auto it = m_index.find(text); it != m_index.end())
+        return it->second;
+    const auto index = static_cast<std::uint32_t>(m_strings.size());
+    m_index.emplace(std::string(text), index);
+    m_strings.push_back(utf8ToUtf16(text));
+    return index;
 }
 
 namespace {

@@ -18,14 +18,19 @@ public:
     // The index of this UTF-8 text, adding it on first use; counts one more use.
     std::uint32_t add(std::string_view text);
     // The index of a text already added.
-    std::uint32_t indexOf(const std::string& text) const { return m_index.at(text); }
+    std::uint32_t indexOf(std::string_view text) const { return m_index.find(text)->second; }
 
     std::uint32_t totalCount() const { return m_total; }
     std::uint32_t uniqueCount() const { return static_cast<std::uint32_t>(m_strings.size()); }
     const std::vector<std::u16string>& strings() const { return m_strings; }
 
 private:
-    std::unordered_map<std::string, std::uint32_t> m_index;
+    // Looked up by string_view, so that finding a text already added allocates nothing.
+    struct TextHash {
+        using is_transparent = void;
+        std::size_t operator()(std::string_view text) const { return std::hash<std::string_view> {}(text); }
+    };
+    std::unordered_map<std::string, std::uint32_t, TextHash, std::equal_to<>> m_index;
     std::vector<std::u16string> m_strings;
     std::uint32_t m_total = 0;
 };

@@ -110,14 +110,20 @@ private:
             if (!data || data->isEmpty())
                 continue;
             m_rows.push_back(row);
-            m_sheet.cellSpans(row, m_spans);
-            if (m_spans.empty())
+            // The row's cells: its runs of own formats and its cells with content.
+            if (data->styleRuns.empty() && data->cells.empty())
                 continue;
             if (lastCellRow < 0)
                 firstCellRow = row;
             lastCellRow = row;
-            firstColumn = std::min(firstColumn, m_spans.front().firstColumn);
-            lastColumn = std::max(lastColumn, m_spans.back().lastColumn);
+            if (!data->styleRuns.empty()) {
+                firstColumn = std::min<int>(firstColumn, data->styleRuns.front().firstColumn);
+                lastColumn = std::max<int>(lastColumn, data->styleRuns.back().lastColumn);
+            }
+            if (!data->cells.empty()) {
+                firstColumn = std::min<int>(firstColumn, data->cells.front().column);
+                lastColumn = std::max<int>(lastColumn, data->cells.back().column);
+            }
         }
         if (lastCellRow >= 0) {
             m_cellRows = { firstCellRow - 1, lastCellRow };
@@ -304,10 +310,11 @@ private:
     std::vector<int> m_rows;
     std::pair<int, int> m_cellRows { 0, 0 };
     std::pair<int, int> m_cellColumns { 0, 0 };
-    std::vector<CellSpan> m_spans;
     std::array<std::vector<CellSpan>, biff::kRowsPerBlock> m_blockSpans;
     std::vector<std::uint16_t> m_blankXfs;
     std::vector<std::size_t> m_firstCells;
+    FormulaEncoder m_encoder;
+    ByteBuffer m_tokens;
 };
 
 } // namespace

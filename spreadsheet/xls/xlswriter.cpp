@@ -94,29 +94,43 @@ void writePrintAreas(RecordWriter& writer, const Workbook& workbook)
     }
 }
 
-SharedStrings collectStrings(const Workbook& workbook)
+// One pass over every existing cell: the formats the sheets use (sheet, columns, rows and
+// cells) and the texts of the shared string table, both in the order the cells come.
+void scanWorkbook(const Workbook& workbook, CellFormatTable& formats, SharedStrings& strings)
 {
-    SharedStrings strings;
+    std::vector<CellSpan> spans;
     for (int index = 0; index < workbook.sheetCount(); ++index) {
-        workbook.sheet(index).forEachContent(
-            Region::wholeSheet(), [&](CellPosition position, const CellContent& content) {
-                const std::string* text = std::get_if<std::string>(&content);
-                if (!text)
-                    return;
-                if (strings.strings()[strings.add(*text)].size() > biff::kMaxCellTextLength)
-                    throw WriteError("the text in " + columnLetters(position.column) + std::to_string(position.row)
+        const Sheet& sheet = workbook.sheet(index);
+        formats.use(sheet.sheetStyle());
+        for (int column = 1; column <= kMaxColumns; ++column) {
+            if (const auto style = sheet.columnStyle(column))
+                formats.use(*style);
+        }
+        for (int row = 1; row <= sheet.lastStoredRow(); ++row) {
+            const RowData* data = sheet.rowData(row);
+            if (!data)
+                continue;
+            if (data->style)
+                formats.use(*data->style);
+            sheet.cellSpans(row, spans);
+            for (const CellSpan& span : spans) {
+                formats.use(span.style);
+                const std::string* text = span.content ? std::get_if<std::string>(span.content) : nullptr;
+                if (text && strings.strings()[strings.add(*text)].size() > biff::kMaxCellTextLength)
+                    throw WriteError("the text in " + columnLetters(span.firstColumn) + std::to_string(row)
                         + " is longer than 32767 characters");
-            });
+            }
+        }
     }
-    return strings;
 }
 
 } // namespace
 
 std::vector<std::uint8_t> writeWorkbookStream(const Workbook& workbook)
 {
-    const CellFormatTable formats(workbook);
-    const SharedStrings strings = collectStrings(workbook);
+    CellFormatTable formats(workbook.styles());
+    SharedStrings strings;
+    scanWorkbook(workbook, formats, strings);
 
     ByteBuffer out(1 << 16);
     RecordWriter writer(out);
