@@ -5,6 +5,7 @@
 #include "spreadsheet/xls/compoundfilewriter.h"
 #include "spreadsheet/xls/recordreader.h"
 #include "spreadsheet/xls/sheetrecords.h"
+#include "spreadsheet/xls/xlsreader.h"
 #include "spreadsheet/xls/xlswriter.h"
 #include "tests/xls/support/expecteddump.h"
 #include "tests/xls/support/readers.h"
@@ -324,6 +325,75 @@ TEST(XlsInterop, LibreOfficeDoesNotTrustCachedResults)
     const auto numbers = shownNumbers(libreOfficeDump(folder, file));
     ASSERT_TRUE(numbers.count("0 6 2"));
     EXPECT_EQ(numbers.at("0 6 2"), "350");
+}
+
+std::vector<std::uint8_t> readBytes(const std::filesystem::path& path)
+{
+    std::ifstream in(path, std::ios::binary);
+    return { std::istreambuf_iterator<char>(in), {} };
+}
+
+// Our reader on a workbook LibreOffice saved from ours: its own record choices (formulas for
+// constants, shared formulas, its palette, its spelling of number formats) read back to the
+// same contents, formats, merges and page.
+TEST(XlsInterop, ReadsWhatLibreOfficeSavesFromOurWorkbook)
+{
+    PENMOOR_NEED_READER(test::hasProgram("soffice"), "LibreOffice (libreoffice-calc-nogui)");
+    test::TempDir folder;
+    test::TempDir resaved;
+    const Workbook book = sampleBook();
+    const auto converted = test::convertWithLibreOffice(saveSample(folder, book, "sample.xls"), "xls", resaved.path());
+    ASSERT_FALSE(converted.empty());
+    const Workbook back = readXls(readBytes(converted));
+    ASSERT_EQ(back.sheetCount(), book.sheetCount());
+    for (int index = 0; index < book.sheetCount(); ++index) {
+        const Sheet& want = book.sheet(index);
+        const Sheet& got = back.sheet(index);
+        EXPECT_EQ(got.name(), want.name());
+        want.forEachContent(Region::wholeSheet(), [&](CellPosition position, const CellContent& content) {
+            const CellContent* read = got.content(position);
+            ASSERT_NE(read, nullptr) << cellName(position);
+            if (std::holds_alternative<Formula>(content)) {
+                // LibreOffice caches text and boolean results as numbers; the tokens must decode.
+                EXPECT_TRUE(std::holds_alternative<Formula>(*read)) << cellName(position);
+            } else if (const Formula* formula = std::get_if<Formula>(read)) {
+                // Constants it writes as formulas keep their value as the result.
+                EXPECT_EQ(formula->cachedValue.index(), content.index()) << cellName(position);
+            } else {
+                EXPECT_EQ(*read, content) << cellName(position);
+            }
+            // What the cell shows, number format aside (LibreOffice spells it its own way).
+            CellStyle wantStyle = book.styles().style(want.effectiveStyle(position));
+            CellStyle gotStyle = back.styles().style(got.effectiveStyle(position));
+            // Colours by what they show: LibreOffice arranges the palette its own way.
+            const auto shown
+                = [](const Workbook& b, std::uint8_t colour) { return colour ? b.color(colour) : 0xFFFFFFFFu; };
+            EXPECT_EQ(shown(back, gotStyle.font.colorIndex), shown(book, wantStyle.font.colorIndex))
+                << cellName(position);
+            gotStyle.font.colorIndex = wantStyle.font.colorIndex;
+            EXPECT_EQ(gotStyle.font, wantStyle.font) << cellName(position);
+            EXPECT_EQ(gotStyle.horizontal, wantStyle.horizontal) << cellName(position);
+            EXPECT_EQ(gotStyle.wrapText, wantStyle.wrapText) << cellName(position);
+            EXPECT_EQ(shown(back, gotStyle.fillColorIndex), shown(book, wantStyle.fillColorIndex))
+                << cellName(position);
+            for (std::size_t side = 0; side < 4; ++side)
+                EXPECT_EQ(gotStyle.edges[side].line, wantStyle.edges[side].line) << cellName(position);
+        });
+        std::vector<Region> wantMerged = want.mergedAreas();
+        EXPECT_EQ(got.mergedAreas(), wantMerged);
+        const PageSetup& page = want.pageSetup();
+        const PageSetup& gotPage = got.pageSetup();
+        EXPECT_EQ(gotPage.printArea, page.printArea);
+        EXPECT_EQ(gotPage.orientation, page.orientation);
+        EXPECT_EQ(gotPage.paperSize, page.paperSize);
+        EXPECT_EQ(gotPage.zoomPercent, page.zoomPercent);
+        EXPECT_DOUBLE_EQ(gotPage.leftMarginInches, page.leftMarginInches);
+        EXPECT_DOUBLE_EQ(gotPage.topMarginInches, page.topMarginInches);
+        for (int column = 1; column <= 12; ++column)
+            EXPECT_NEAR(got.effectiveColumnWidth(column), want.effectiveColumnWidth(column), 0.02) << column;
+        for (int row = 1; row <= 8; ++row)
+            EXPECT_NEAR(got.effectiveRowHeight(row), want.effectiveRowHeight(row), 0.05) << row;
+    }
 }
 
 } // namespace

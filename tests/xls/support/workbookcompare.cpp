@@ -54,16 +54,29 @@ std::string contentText(const CellContent* content, CellPosition position)
         *content);
 }
 
-std::string styleText(const CellStyle& style)
+// A colour index as itself, or as the colour it shows in this workbook.
+std::string colourText(const Workbook& book, std::uint8_t index, ColourMatch match)
+{
+    if (match == ColourMatch::ByIndex || index == kAutomaticColor)
+        return std::to_string(index);
+    std::ostringstream out;
+    out << "#" << std::hex << book.color(index);
+    return out.str();
+}
+
+std::string styleText(const Workbook& book, const CellStyle& style, ColourMatch match)
 {
     std::ostringstream out;
     out << style.font.name << " " << style.font.sizePoints << (style.font.bold ? " bold" : "")
-        << (style.font.italic ? " italic" : "") << " colour " << int { style.font.colorIndex } << " fill "
-        << int { style.fillColorIndex } << " format \"" << style.numberFormat << "\" align "
-        << static_cast<int>(style.horizontal) << "/" << static_cast<int>(style.vertical)
-        << (style.wrapText ? " wrap" : "") << " edges";
-    for (const Edge& edge : style.edges)
-        out << " " << static_cast<int>(edge.line) << ":" << int { edge.colorIndex };
+        << (style.font.italic ? " italic" : "") << " colour " << colourText(book, style.font.colorIndex, match)
+        << " fill " << (style.fillColorIndex == kNoFill ? "none" : colourText(book, style.fillColorIndex, match))
+        << " format \"" << style.numberFormat << "\" align " << static_cast<int>(style.horizontal) << "/"
+        << static_cast<int>(style.vertical) << (style.wrapText ? " wrap" : "") << " edges";
+    for (const Edge& edge : style.edges) {
+        out << " " << static_cast<int>(edge.line);
+        if (edge.line != LineStyle::None)
+            out << ":" << colourText(book, edge.colorIndex, match);
+    }
     return out.str();
 }
 
@@ -95,9 +108,11 @@ std::string pageText(const PageSetup& page)
 
 class Differences {
 public:
+    static constexpr int kShown = 60;
+
     template <typename T> void check(const std::string& what, const T& expected, const T& actual)
     {
-        if (expected == actual || m_count++ >= 30)
+        if (expected == actual || m_count++ >= kShown)
             return;
         std::ostringstream out;
         out << what << ": expected " << expected << ", got " << actual << "\n";
@@ -105,7 +120,7 @@ public:
     }
     std::string text() const
     {
-        return m_count > 30 ? m_text + "(" + std::to_string(m_count - 30) + " more)\n" : m_text;
+        return m_count > kShown ? m_text + "(" + std::to_string(m_count - kShown) + " more)\n" : m_text;
     }
 
 private:
@@ -130,8 +145,8 @@ std::string joined(const std::vector<std::string>& items)
     return text;
 }
 
-void compareSheets(
-    Differences& diff, const Workbook& wantBook, const Sheet& want, const Workbook& gotBook, const Sheet& got)
+void compareSheets(Differences& diff, const Workbook& wantBook, const Sheet& want, const Workbook& gotBook,
+    const Sheet& got, ColourMatch match)
 {
     const std::string at = "sheet \"" + want.name() + "\" ";
     diff.check(at + "default row height", want.defaultRowHeight(), got.defaultRowHeight());
@@ -146,8 +161,8 @@ void compareSheets(
         for (int column = 1; column <= kMaxColumns; ++column) {
             const CellPosition position { row, column };
             diff.check(at + name(position) + " format",
-                styleText(wantBook.styles().style(want.effectiveStyle(position))),
-                styleText(gotBook.styles().style(got.effectiveStyle(position))));
+                styleText(wantBook, wantBook.styles().style(want.effectiveStyle(position)), match),
+                styleText(gotBook, gotBook.styles().style(got.effectiveStyle(position)), match));
             diff.check(at + name(position), contentText(want.content(position), position),
                 contentText(got.content(position), position));
         }
@@ -160,17 +175,17 @@ void compareSheets(
 
 } // namespace
 
-std::string workbookDifferences(const Workbook& expected, const Workbook& actual)
+std::string workbookDifferences(const Workbook& expected, const Workbook& actual, ColourMatch colours)
 {
     Differences diff;
     diff.check("sheet count", expected.sheetCount(), actual.sheetCount());
     diff.check("active sheet", expected.activeSheetIndex(), actual.activeSheetIndex());
-    for (int k = 1; k <= kPaletteSize; ++k)
+    for (int k = 1; k <= kPaletteSize && colours == ColourMatch::ByIndex; ++k)
         diff.check("palette colour " + std::to_string(k), expected.color(k), actual.color(k));
     for (int index = 0; index < std::min(expected.sheetCount(), actual.sheetCount()); ++index) {
         diff.check(
             "name of sheet " + std::to_string(index + 1), expected.sheet(index).name(), actual.sheet(index).name());
-        compareSheets(diff, expected, expected.sheet(index), actual, actual.sheet(index));
+        compareSheets(diff, expected, expected.sheet(index), actual, actual.sheet(index), colours);
     }
     return diff.text();
 }
