@@ -2,8 +2,11 @@
 
 #include "automation/contract/error.h"
 #include "spreadsheet/builtin/builtinworksheet.h"
+#include "spreadsheet/formula/recalculation.h"
+#include "spreadsheet/xls/xlsfile.h"
 
 #include <algorithm>
+#include <filesystem>
 
 namespace penmoor::engine {
 
@@ -14,9 +17,10 @@ BuiltinWorkbook::BuiltinWorkbook(WorkbookHandle workbook)
 
 void BuiltinWorkbook::SaveAs(const std::string& path)
 {
-    m_workbook.workbook();
-    throw xl::Error("The workbook \"" + m_workbook.name() + "\" cannot be saved as \"" + path
-        + "\": saving .xls files is not available in this build yet.");
+    engine::Workbook& workbook = m_workbook.workbook();
+    // The file carries every formula's result, so they must be current.
+    recalculate(workbook);
+    xls::saveXlsFile(workbook, path);
 }
 
 void BuiltinWorkbook::Close()
@@ -67,8 +71,14 @@ std::unique_ptr<xl::Workbook> BuiltinWorkbooks::Add()
 std::unique_ptr<xl::Workbook> BuiltinWorkbooks::Open(const std::string& path)
 {
     m_application->checkRunning();
-    throw xl::Error(
-        "The workbook \"" + path + "\" cannot be opened: opening .xls files is not available in this build yet.");
+    auto document = std::make_shared<Document>();
+    document->model = std::make_unique<engine::Workbook>(xls::openXlsFile(path));
+    // Named after the file, as the desktop application shows it.
+    const std::u8string fileName = std::filesystem::path(std::u8string(path.begin(), path.end())).filename().u8string();
+    document->name.assign(fileName.begin(), fileName.end());
+    m_application->documents.push_back(document);
+    m_application->activeDocument = document;
+    return std::make_unique<BuiltinWorkbook>(WorkbookHandle(m_application, document));
 }
 
 int BuiltinWorkbooks::count() const
