@@ -31,33 +31,44 @@ void setRowHeight(SheetWriter& sheet, const std::string& row, double height)
     sheet.SetRowHeight(row + ":" + row, height);
 }
 
-// The first item holds the opening cash of each period: the cash position of the column to
-// its left.
-std::string openingCashFormula(const Options& options)
+// The opening balance of each period is the cash position of the period before, in the column
+// to the left. The item of the opening balance is the first one in every list the editor makes,
+// unless a line was inserted above it; its row carries the balance over all the same.
+std::string openingCashFormula(const Options& options, int position)
 {
     const int cashPosition = options.FindItemRow(kCashPosition);
     if (cashPosition == 0) {
         throw xl::Error("The opening cash of each period comes from the item \"" + std::string(kCashPosition)
             + "\" of the period before, but the item list has no such item.");
     }
-    return "=" + RelativeRef(options, cashPosition, 1, -1);
+    std::string formula = "=";
+    formula += RelativeRef(options, cashPosition, position, -1);
+    return formula;
 }
 
-// The formula of the total at position, or nothing for a kind that has none.
-std::string totalRowFormula(const Options& options, int position)
+std::string combinedFormula(const Options& options, int position, Combination combination)
 {
-    if (position == 1) {
-        return openingCashFormula(options);
-    }
-    const TotalKind kind = options.item(position).totalKind;
-    if (kind != TotalKind::Sum && kind != TotalKind::Dif) {
-        return {};
-    }
     std::vector<int> rowOffsets;
     for (const int linked : linkedPositions(options, position)) {
         rowOffsets.push_back(RowOffset(options, linked, position));
     }
-    return totalFormula(kind == TotalKind::Sum ? Combination::Sum : Combination::Difference, rowOffsets);
+    return totalFormula(combination, rowOffsets);
+}
+
+// The formula of the total at position, the same text for every column of its row.
+std::string totalRowFormula(const Options& options, int position)
+{
+    switch (options.item(position).totalKind) {
+    case TotalKind::Other:
+        return openingCashFormula(options, position);
+    case TotalKind::Sum:
+        return combinedFormula(options, position, Combination::Sum);
+    case TotalKind::Dif:
+        return combinedFormula(options, position, Combination::Difference);
+    case TotalKind::None:
+        break;
+    }
+    return {};
 }
 
 void writeTotalFormulas(
@@ -67,8 +78,9 @@ void writeTotalFormulas(
     if (formula.empty()) {
         return;
     }
-    // Relative references make one formula text right for every column of the row.
-    const int firstColumn = position == 1 ? kFirstPeriodColumn : kPreStartupColumn;
+    // The pre-startup column has no period before it: its opening cash is typed in.
+    const bool carriedOver = options.item(position).totalKind == TotalKind::Other;
+    const int firstColumn = carriedOver ? kFirstPeriodColumn : kPreStartupColumn;
     for (int column = firstColumn; column <= lastColumn; ++column) {
         sheet.PutCell(ColumnLetters(column) + row, formula, true);
     }
