@@ -11,6 +11,7 @@
 
 #include <charconv>
 #include <string_view>
+#include <vector>
 
 namespace penmoor {
 
@@ -36,14 +37,34 @@ void setRowHeight(SheetWriter& sheet, const std::string& row, double height)
 // unless a line was inserted above it; its row carries the balance over all the same.
 std::string openingCashFormula(const Options& options, int position)
 {
-    const int cashPosition = options.FindItemRow(kCashPosition);
-    if (cashPosition == 0) {
-        throw xl::Error("The opening cash of each period comes from the item \"" + std::string(kCashPosition)
-            + "\" of the period before, but the item list has no such item.");
-    }
+    // Without that item FindItemRow gives 0, which RelativeRef refuses as no item of the list.
     std::string formula = "=";
-    formula += RelativeRef(options, cashPosition, position, -1);
+    formula += RelativeRef(options, options.FindItemRow(kCashPosition), position, -1);
     return formula;
+}
+
+// The positions that the linkage list of the item at position names, in list order. Raises
+// xl::Error for an element that is not a number; RowOffset refuses positions outside the list.
+std::vector<int> linkedPositions(const Options& options, int position)
+{
+    const TemplateItem& item = options.item(position);
+    std::vector<int> positions;
+    std::string_view rest = item.linkage;
+    for (;;) {
+        const std::size_t comma = rest.find(',');
+        const std::string_view element = rest.substr(0, comma);
+        int linked = 0;
+        const auto [end, error] = std::from_chars(element.data(), element.data() + element.size(), linked);
+        if (element.empty() || error != std::errc() || end != element.data() + element.size()) {
+            throw xl::Error("The total \"" + item.name + "\" combines \"" + std::string(element)
+                + "\", which is not the number of an item.");
+        }
+        positions.push_back(linked);
+        if (comma == std::string_view::npos) {
+            return positions;
+        }
+        rest.remove_prefix(comma + 1);
+    }
 }
 
 std::string combinedFormula(const Options& options, int position, Combination combination)
@@ -108,32 +129,6 @@ int numberItemRows(Options& options)
         options.setSheetRow(position, rowCounter + kHeaderRows);
     }
     return rowCounter;
-}
-
-std::vector<int> linkedPositions(const Options& options, int position)
-{
-    const TemplateItem& item = options.item(position);
-    std::vector<int> positions;
-    std::string_view rest = item.linkage;
-    for (;;) {
-        const std::size_t comma = rest.find(',');
-        const std::string_view element = rest.substr(0, comma);
-        int linked = 0;
-        const auto [end, error] = std::from_chars(element.data(), element.data() + element.size(), linked);
-        if (element.empty() || error != std::errc() || end != element.data() + element.size()) {
-            throw xl::Error("The total \"" + item.name + "\" combines \"" + std::string(element)
-                + "\", which is not the number of an item.");
-        }
-        if (linked < 1 || linked > options.count()) {
-            throw xl::Error("The total \"" + item.name + "\" combines item " + std::string(element)
-                + ", but the item list holds " + std::to_string(options.count()) + " items.");
-        }
-        positions.push_back(linked);
-        if (comma == std::string_view::npos) {
-            return positions;
-        }
-        rest.remove_prefix(comma + 1);
-    }
 }
 
 void writeItemRows(SheetWriter& sheet, const Options& options, int lastColumn)

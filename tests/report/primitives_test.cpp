@@ -78,18 +78,6 @@ TEST(PeriodSettings, TotalColumnOfEachModeFromTheMainWindowsBoxes)
     }
 }
 
-TEST(PeriodSettings, MonthBoxesAreReadOnlyInMonthMode)
-{
-    BuildHarness harness;
-    harness.byMonth("2013.5", "2015");
-    harness.byYear("2020", "2021");
-    const PeriodSettings settings = PeriodSettings::read(harness.view);
-    EXPECT_EQ(settings.mode, PeriodMode::ByYear);
-    EXPECT_EQ(settings.firstMonthYear, 0);
-    harness.view.setOptionOn(OptionButton::Option3, true);
-    EXPECT_EQ(PeriodSettings::read(harness.view).firstMonthYear, 2013.5);
-}
-
 TEST(ItemReferences, CountRowsAsTheBuilderNumberedThem)
 {
     BuildHarness harness;
@@ -105,14 +93,6 @@ TEST(ItemReferences, CountRowsAsTheBuilderNumberedThem)
     EXPECT_EQ(RelativeRef(harness.options, 7, 7, 0), "R[0]C[0]");
     EXPECT_THROW(RowOffset(harness.options, 0, 1), xl::Error);
     EXPECT_THROW(RelativeRef(harness.options, 1, 45, 0), xl::Error);
-}
-
-TEST(ItemReferences, LinkedPositionsOfTheDefaultTotals)
-{
-    BuildHarness harness;
-    EXPECT_EQ(linkedPositions(harness.options, 6), (std::vector<int> { 3, 4, 5 }));
-    EXPECT_EQ(linkedPositions(harness.options, 37), (std::vector<int> { 7, 36 }));
-    EXPECT_EQ(linkedPositions(harness.options, 30).size(), 21u);
 }
 
 TEST(TotalFormula, ChainOfSingleReferencesWhileItFitsTheFormatsLimit)
