@@ -102,7 +102,7 @@ TEST(TotalFormula, ChainOfSingleReferencesWhileItFitsTheFormatsLimit)
     EXPECT_EQ(totalFormula(Combination::Difference, std::vector { -24, -2 }), "=R[-24]C[0]-R[-2]C[0]");
     EXPECT_EQ(totalFormula(Combination::Difference, std::vector { 3 }), "=R[3]C[0]");
 
-    // Exactly 1,024 characters still make the specified chain; one more folds.
+    // Exactly 1,024 characters still make the plain chain; one more folds.
     const std::string longest = totalFormula(Combination::Sum, offsetsFrom(-177, -92));
     EXPECT_EQ(longest.size(), 1024u);
     EXPECT_EQ(longest.substr(0, 24), "=R[-177]C[0]+R[-176]C[0]");
