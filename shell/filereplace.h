@@ -1,0 +1,18 @@
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <span>
+#include <system_error>
+
+namespace penmoor {
+
+// Gives the file at target exactly these bytes. They are written to a new file beside it first
+// and that file is then renamed over target in one step, so target is never half-written and an
+// existing file there is replaced only once its successor is complete. On failure target is as
+// it was, nothing is left beside it, and the result holds the system's reason; it is empty on
+// success.
+[[nodiscard]] std::error_code replaceFileContents(
+    const std::filesystem::path& target, std::span<const std::uint8_t> bytes);
+
+} // namespace penmoor
