@@ -91,9 +91,8 @@ xl::Picture loadPictureFile(const std::filesystem::path& path)
         throw refuse("it is not an uncompressed bitmap of 24 bits per pixel");
     }
     const auto width = std::int64_t { static_cast<std::int32_t>(read32(bytes, kWidthAt)) };
-    const auto storedHeight = std::int64_t { static_cast<std::int32_t>(read32(bytes, kHeightAt)) };
-    const bool bottomUp = storedHeight > 0;
-    const std::int64_t height = bottomUp ? storedHeight : -storedHeight;
+    // A positive height: rows stored from the bottom up.
+    const auto height = std::int64_t { static_cast<std::int32_t>(read32(bytes, kHeightAt)) };
     if (width <= 0 || height <= 0 || width > kMaximumSide || height > kMaximumSide || width * height > kMaximumPixels) {
         throw refuse("its size is not that of a sheet picture");
     }
@@ -108,8 +107,7 @@ xl::Picture loadPictureFile(const std::filesystem::path& path)
     picture.height = static_cast<int>(height);
     picture.pixels.resize(static_cast<std::size_t>(width * height));
     for (std::int64_t row = 0; row < height; ++row) {
-        const std::int64_t stored = bottomUp ? height - 1 - row : row;
-        const std::uint8_t* source = bytes.data() + pixelOffset + stored * rowBytes;
+        const std::uint8_t* source = bytes.data() + pixelOffset + (height - 1 - row) * rowBytes;
         std::uint32_t* target = picture.pixels.data() + row * width;
         for (std::int64_t x = 0; x < width; ++x, source += 3) {
             target[x]

@@ -13,7 +13,7 @@ namespace penmoor {
 void writePictureFile(const std::filesystem::path& path, const xl::Picture& picture);
 
 // Loads a picture file as writePictureFile writes it (uncompressed, 24 bits per pixel, rows
-// bottom-up or top-down). Raises std::runtime_error when the file is missing, cannot be read
+// from the bottom up). Raises std::runtime_error when the file is missing, cannot be read
 // or holds anything else.
 xl::Picture loadPictureFile(const std::filesystem::path& path);
 
