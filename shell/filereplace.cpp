@@ -49,9 +49,9 @@ std::error_code writeWhole(const fs::path& path, std::span<const std::uint8_t> b
     return { code, std::generic_category() };
 }
 
-// Moves from to to, replacing a file at to in one step. POSIX rename does that; on Windows the
-// C runtime's rename refuses an existing target, so the system call is asked to replace it.
-std::error_code moveOver(const fs::path& from, const fs::path& to)
+} // namespace
+
+std::error_code moveFileOver(const fs::path& from, const fs::path& to)
 {
     std::error_code error;
 #ifdef _WIN32
@@ -64,15 +64,13 @@ std::error_code moveOver(const fs::path& from, const fs::path& to)
     return error;
 }
 
-} // namespace
-
 std::error_code replaceFileContents(const fs::path& target, std::span<const std::uint8_t> bytes)
 {
     const fs::path temporary = temporaryBeside(target);
     if (const std::error_code error = writeWhole(temporary, bytes)) {
         return error;
     }
-    const std::error_code error = moveOver(temporary, target);
+    const std::error_code error = moveFileOver(temporary, target);
     if (error) {
         std::error_code ignored; // the complete but unplaced copy must not stay behind
         fs::remove(temporary, ignored);

@@ -15,4 +15,9 @@ namespace penmoor {
 [[nodiscard]] std::error_code replaceFileContents(
     const std::filesystem::path& target, std::span<const std::uint8_t> bytes);
 
+// Moves the file from over to in one step, replacing a file at to. POSIX rename does that; on
+// Windows the C runtime's rename refuses an existing target, so the system is asked to replace
+// it. Empty on success, otherwise the system's reason.
+[[nodiscard]] std::error_code moveFileOver(const std::filesystem::path& from, const std::filesystem::path& to);
+
 } // namespace penmoor

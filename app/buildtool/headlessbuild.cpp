@@ -12,7 +12,6 @@
 #include "shell/filereplace.h"
 #include "shell/fileutils.h"
 #include "shell/unitrandom.h"
-#include "spreadsheet/xls/filereplace.h"
 
 #include <stdexcept>
 
@@ -36,9 +35,7 @@ public:
     // Moves the file over target in one step.
     void place(const fs::path& target)
     {
-        std::error_code error;
-        xls::replaceFile(m_path, target, error);
-        if (error) {
+        if (const std::error_code error = moveFileOver(m_path, target)) {
             throw std::runtime_error("Could not write \"" + utf8Text(target) + "\": " + error.message() + ".");
         }
         m_path.clear();

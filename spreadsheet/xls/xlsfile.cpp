@@ -1,7 +1,7 @@
 #include "spreadsheet/xls/xlsfile.h"
 
 #include "automation/contract/error.h"
-#include "spreadsheet/xls/filereplace.h"
+#include "shell/filereplace.h"
 #include "spreadsheet/xls/formaterror.h"
 #include "spreadsheet/xls/xlsreader.h"
 #include "spreadsheet/xls/xlswriter.h"
@@ -10,7 +10,6 @@
 #include <cstring>
 #include <filesystem>
 #include <fstream>
-#include <random>
 
 namespace penmoor::xls {
 
@@ -31,36 +30,6 @@ std::string systemReason(int code)
     return std::generic_category().message(code);
 }
 
-// A name beside the target that no other file has, for writing the new workbook first.
-fs::path temporaryBeside(const fs::path& target)
-{
-    std::random_device seed;
-    std::mt19937_64 random((std::uint64_t { seed() } << 32) | seed());
-    for (;;) {
-        fs::path candidate = target;
-        candidate += ".~" + std::to_string(random() % 1000000000) + ".tmp";
-        std::error_code ignored; // an unreadable folder shows when the file is created
-        if (!fs::exists(candidate, ignored))
-            return candidate;
-    }
-}
-
-void writeWhole(const fs::path& path, const std::vector<std::uint8_t>& bytes, const std::string& shownPath)
-{
-    errno = 0;
-    std::ofstream out(path, std::ios::binary | std::ios::trunc);
-    if (out)
-        out.write(reinterpret_cast<const char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()));
-    if (out)
-        out.close();
-    if (!out) {
-        const int code = errno != 0 ? errno : EIO;
-        std::error_code ignored; // the partial file is removed as far as the system lets us
-        fs::remove(path, ignored);
-        throw xl::Error("The workbook cannot be saved as \"" + shownPath + "\": " + systemReason(code) + ".");
-    }
-}
-
 } // namespace
 
 void saveXlsFile(const engine::Workbook& workbook, const std::string& path)
@@ -71,16 +40,8 @@ void saveXlsFile(const engine::Workbook& workbook, const std::string& path)
     } catch (const WriteError& error) {
         throw xl::Error("The workbook cannot be saved as \"" + path + "\": " + error.what() + ".");
     }
-    const fs::path target = filePath(path);
-    const fs::path temporary = temporaryBeside(target);
-    writeWhole(temporary, bytes, path);
-    std::error_code error;
-    replaceFile(temporary, target, error);
-    if (error) {
-        std::error_code ignored; // the complete but unplaced copy must not stay behind
-        fs::remove(temporary, ignored);
+    if (const std::error_code error = replaceFileContents(filePath(path), bytes))
         throw xl::Error("The workbook cannot be saved as \"" + path + "\": " + error.message() + ".");
-    }
 }
 
 engine::Workbook openXlsFile(const std::string& path)
