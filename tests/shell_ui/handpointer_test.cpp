@@ -63,12 +63,9 @@ TEST_F(HandPointerTest, ThePointerFileGivesItsImageAndHotSpot)
     ASSERT_EQ(pointer.shape(), Qt::BitmapCursor);
     EXPECT_EQ(pointer.pixmap().size(), QSize(32, 32));
     EXPECT_EQ(pointer.hotSpot(), QPoint(5, 7));
-}
 
-TEST_F(HandPointerTest, AHotSpotOutsideTheImageIsKeptOnIt)
-{
+    // A hot spot outside the image is kept on it.
     writePointerFile(cursorBytes(200, 40));
-
     EXPECT_EQ(loadHandPointer(folder.path()).hotSpot(), QPoint(31, 31));
 }
 

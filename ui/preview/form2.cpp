@@ -12,6 +12,7 @@
 #include <algorithm>
 #include <cstdlib>
 #include <exception>
+#include <utility>
 
 #include <QCloseEvent>
 #include <QCoreApplication>
