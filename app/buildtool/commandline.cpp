@@ -79,7 +79,7 @@ std::string systemRowList()
             continue;
         }
         if (!line.empty() && line.size() + name.size() > 80) {
-            list += line + "\n";
+            list += line + ",\n";
             line.clear();
         }
         line += (line.empty() ? "  " : ", ") + std::string(name);
