@@ -3,20 +3,15 @@
 #include "automation/contract/constants.h"
 #include "automation/contract/error.h"
 #include "spreadsheet/builtin/builtinapplication.h"
+#include "tests/xls/support/files.h"
 #include "tests/xls/support/tempdir.h"
-
-#include <fstream>
 
 #include <gtest/gtest.h>
 
 namespace penmoor::xls {
 namespace {
 
-std::string utf8(const std::filesystem::path& path)
-{
-    const std::u8string text = path.u8string();
-    return { text.begin(), text.end() };
-}
+using test::utf8;
 
 // A little cash-flow sheet through the contract, saved at `path`.
 void buildAndSave(const std::string& path)
@@ -104,9 +99,7 @@ TEST(BuiltinSaveOpen, AFileThatIsNoWorkbookIsNamedInTheError)
 {
     test::TempDir folder;
     const std::string path = utf8(folder.file("notes.xls"));
-    {
-        std::ofstream(folder.file("notes.xls")) << "not a workbook";
-    }
+    test::writeFile(folder.file("notes.xls"), "not a workbook");
     auto app = engine::BuiltinApplicationFactory().create();
     try {
         app->Workbooks()->Open(path);

@@ -2,21 +2,14 @@
 // wrote, with their sizes, and reads their bytes back.
 #include "spreadsheet/xls/compoundfilewriter.h"
 #include "tests/xls/support/cfbtestfiles.h"
+#include "tests/xls/support/files.h"
 #include "tests/xls/support/readers.h"
 #include "tests/xls/support/tempdir.h"
-
-#include <fstream>
 
 #include <gtest/gtest.h>
 
 namespace penmoor::xls {
 namespace {
-
-void save(const std::filesystem::path& path, const std::vector<std::uint8_t>& bytes)
-{
-    std::ofstream out(path, std::ios::binary);
-    out.write(reinterpret_cast<const char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()));
-}
 
 TEST(CompoundFileInterop, OlefileListsTheStreamsWithTheirSizes)
 {
@@ -40,7 +33,7 @@ TEST(CompoundFileInterop, OlefileListsTheStreamsWithTheirSizes)
             expected.push_back(name + " " + std::to_string(layouts[l][i]));
         }
         const auto path = folder.file("layout" + std::to_string(l) + ".cfb");
-        save(path, writeCompoundFile(streams));
+        test::writeFile(path, writeCompoundFile(streams));
         EXPECT_EQ(test::lines(test::runPythonScript("olefile_list.py", { path.string() })), expected) << "layout " << l;
     }
 }

@@ -3,11 +3,11 @@
 #include "automation/contract/error.h"
 #include "spreadsheet/xls/xlsfile.h"
 #include "spreadsheet/xls/xlswriter.h"
+#include "tests/xls/support/files.h"
 #include "tests/xls/support/sampleworkbooks.h"
 #include "tests/xls/support/tempdir.h"
 #include "tests/xls/support/workbookcompare.h"
 
-#include <fstream>
 #include <functional>
 
 #include <gtest/gtest.h>
@@ -16,32 +16,10 @@ namespace penmoor::xls {
 namespace {
 
 using namespace engine;
-
-std::string utf8(const std::filesystem::path& path)
-{
-    const std::u8string text = path.u8string();
-    return { text.begin(), text.end() };
-}
-
-void writeText(const std::filesystem::path& path, const std::string& text)
-{
-    std::ofstream(path, std::ios::binary) << text;
-}
-
-std::string readText(const std::filesystem::path& path)
-{
-    std::ifstream in(path, std::ios::binary);
-    return { std::istreambuf_iterator<char>(in), {} };
-}
-
-std::vector<std::string> folderContents(const std::filesystem::path& folder)
-{
-    std::vector<std::string> names;
-    for (const auto& entry : std::filesystem::directory_iterator(folder))
-        names.push_back(utf8(entry.path().filename()));
-    std::sort(names.begin(), names.end());
-    return names;
-}
+using test::folderContents;
+using test::readFile;
+using test::utf8;
+using test::writeFile;
 
 // The xl::Error text of a call, or "" when it succeeds.
 std::string failure(const std::function<void()>& call)
@@ -62,17 +40,16 @@ TEST(XlsFile, SavesAndOpensUnderAnyName)
     saveXlsFile(book, path);
     EXPECT_EQ(folderContents(folder.path()), std::vector<std::string> { "Überschuss 現金 2013.xls" });
     EXPECT_EQ(test::workbookDifferences(book, openXlsFile(path)), "");
-    EXPECT_EQ(readText(folder.file("Überschuss 現金 2013.xls")).size(), writeXls(book).size());
+    EXPECT_EQ(readFile(folder.file("Überschuss 現金 2013.xls")), writeXls(book));
 }
 
 TEST(XlsFile, ReplacesAnExistingFileWhole)
 {
     test::TempDir folder;
     const auto path = folder.file("plan.xls");
-    writeText(path, std::string(100000, 'x'));
+    writeFile(path, std::string(100000, 'x'));
     saveXlsFile(test::cashFlowSample(), utf8(path));
-    const auto bytes = writeXls(test::cashFlowSample());
-    EXPECT_EQ(readText(path), std::string(bytes.begin(), bytes.end()));
+    EXPECT_EQ(readFile(path), writeXls(test::cashFlowSample()));
     EXPECT_EQ(folderContents(folder.path()), std::vector<std::string> { "plan.xls" });
 }
 
@@ -94,12 +71,12 @@ TEST(XlsFile, FailedSavesLeaveNothingBehindAndSayWhy)
 
     // A workbook the format cannot hold leaves the existing file as it was.
     const auto kept = folder.file("kept.xls");
-    writeText(kept, "the old workbook");
+    writeFile(kept, "the old workbook");
     Workbook tooLong;
     tooLong.addSheet("S").setContent({ 1, 1 }, std::string(40000, 'x'));
     EXPECT_NE(failure([&] { saveXlsFile(tooLong, utf8(kept)); }).find("A1 is longer than 32767 characters"),
         std::string::npos);
-    EXPECT_EQ(readText(kept), "the old workbook");
+    EXPECT_EQ(readFile(kept), test::bytesOf("the old workbook"));
 
     EXPECT_EQ(folderContents(folder.path()), (std::vector<std::string> { "kept.xls", "taken.xls" }));
 }
@@ -112,13 +89,13 @@ TEST(XlsFile, OpenSaysWhyItCannot)
         "The workbook \"" + missing + "\" cannot be opened: No such file or directory.");
 
     const auto text = folder.file("notes.xls");
-    writeText(text, std::string(2000, 'n'));
+    writeFile(text, std::string(2000, 'n'));
     EXPECT_EQ(failure([&] { openXlsFile(utf8(text)); }),
         utf8(text) + " is not a readable .xls workbook: the file does not start with the compound file signature.");
 
     const auto cut = folder.file("cut.xls");
     const auto bytes = writeXls(test::cashFlowSample());
-    writeText(cut, std::string(bytes.begin(), bytes.begin() + 3000));
+    writeFile(cut, std::span(bytes).first(3000));
     EXPECT_NE(failure([&] { openXlsFile(utf8(cut)); }).find(utf8(cut) + " is not a readable .xls workbook: "),
         std::string::npos);
 }
