@@ -114,23 +114,6 @@ const ExactCase kExactCases[] = {
 INSTANTIATE_TEST_SUITE_P(Layouts, ExactRecord, ::testing::ValuesIn(kExactCases),
     [](const auto& test) { return std::string(test.param.name); });
 
-TEST(ContentRecords, XfFieldsSurviveTheirBitFields)
-{
-    XfRecord xf;
-    xf.font = 6;
-    xf.format = 165;
-    xf.horizontal = 2;
-    xf.vertical = 1;
-    xf.wrap = true;
-    xf.usedAttributes = 0xFC;
-    xf.borderStyle = { 1, 2, 5, 7 };
-    xf.borderColour = { 23, 8, 63, 0x40 };
-    xf.pattern = 1;
-    xf.patternColour = 62;
-    xf.patternBackground = 0x41;
-    EXPECT_EQ(parseXf(body([&](RecordWriter& w) { writeXf(w, xf); })), xf);
-}
-
 TEST(ContentRecords, FontsAndPaletteComeBack)
 {
     FontRecord font { 380, true, true, false, 0, 19, u"Arial Ünicode" };
@@ -145,29 +128,6 @@ TEST(ContentRecords, FontsAndPaletteComeBack)
     auto shortPalette = paletteBody;
     shortPalette[0] = 55;
     EXPECT_THROW(parsePalette(shortPalette), FormatError);
-}
-
-TEST(ContentRecords, PageSetupComesBack)
-{
-    SetupRecord setup;
-    setup.paperSize = 1;
-    setup.scale = 85;
-    setup.fitWidth = 2;
-    setup.fitHeight = 0;
-    setup.printNotes = true;
-    setup.notesAtEnd = true;
-    setup.headerMargin = 0.3;
-    setup.footerMargin = 0.25;
-    const SetupRecord back = parseSetup(body([&](RecordWriter& w) { writeSetup(w, setup); }));
-    EXPECT_EQ(back.paperSize, 1);
-    EXPECT_EQ(back.scale, 85);
-    EXPECT_EQ(back.fitWidth, 2);
-    EXPECT_EQ(back.fitHeight, 0);
-    EXPECT_FALSE(back.landscape);
-    EXPECT_TRUE(back.printNotes && back.notesAtEnd && back.orientationKnown);
-    EXPECT_EQ(back.headerMargin, 0.3);
-    EXPECT_EQ(back.footerMargin, 0.25);
-    EXPECT_FALSE(parseFitToPage(body([](RecordWriter& w) { writeWsBool(w, false); })));
 }
 
 TEST(ContentRecords, RkKeepsExactlyTheValuesItCanHold)
