@@ -1,5 +1,4 @@
 #include "automation/contract/error.h"
-#include "spreadsheet/formula/functiontable.h"
 #include "spreadsheet/formula/r1c1parser.h"
 #include "spreadsheet/formula/r1c1printer.h"
 
@@ -135,24 +134,6 @@ TEST(R1C1Formula, RefusesToPrintTokensThatFormNoFormula)
     for (const TokenArray& tokens : { TokenArray {}, TokenArray { OperatorToken { Operator::Add } },
              TokenArray { NumberToken { 1 }, NumberToken { 2 } }, TokenArray { FunctionToken { 4, 2, {} } } })
         EXPECT_THROW(formatFormulaR1C1(tokens), xl::Error);
-}
-
-TEST(FunctionTable, SharesTheXlsNumbersAndArgumentLimits)
-{
-    for (const auto& [name, index, fixed] :
-        { std::tuple { "SUM", 4, false }, std::tuple { "DATE", 65, true }, std::tuple { "DAY", 67, true },
-            std::tuple { "MONTH", 68, true }, std::tuple { "YEAR", 69, true }, std::tuple { "IF", 1, false } }) {
-        const FunctionInfo* info = findFunction(name);
-        ASSERT_NE(info, nullptr) << name;
-        EXPECT_EQ(info->index, index) << name;
-        EXPECT_EQ(info->hasFixedArgumentCount(), fixed) << name;
-        EXPECT_EQ(findFunction(static_cast<std::uint16_t>(index)), info);
-    }
-    EXPECT_EQ(findFunction("sum"), findFunction("SUM"));
-    EXPECT_EQ(findFunction("SUMX"), nullptr);
-    EXPECT_EQ(findFunction("IF")->parameterClass(0), ParameterClass::Value);
-    EXPECT_EQ(findFunction("IF")->parameterClass(2), ParameterClass::Reference);
-    EXPECT_EQ(findFunction("SUM")->parameterClass(29), ParameterClass::Reference);
 }
 
 } // namespace
