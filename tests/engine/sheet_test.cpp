@@ -118,17 +118,5 @@ TEST_F(SheetContents, SelectionKeepsItsActiveCellInside)
     EXPECT_EQ(sheet.activeCell(), (CellPosition { 8, 1 }));
 }
 
-TEST_F(SheetContents, SizesFallBackToTheSheetDefaults)
-{
-    EXPECT_EQ(sheet.effectiveRowHeight(9), kDefaultRowHeightPoints);
-    EXPECT_EQ(sheet.effectiveColumnWidth(256), kDefaultColumnWidthCharacters);
-    sheet.setRowHeight(9, 0.0);
-    sheet.setDefaultColumnWidth(10.0);
-    EXPECT_EQ(sheet.effectiveRowHeight(9), 0.0);
-    EXPECT_EQ(sheet.effectiveColumnWidth(256), 10.0);
-    sheet.setRowHeight(9, std::nullopt);
-    EXPECT_EQ(sheet.effectiveRowHeight(9), kDefaultRowHeightPoints);
-}
-
 } // namespace
 } // namespace penmoor::engine
