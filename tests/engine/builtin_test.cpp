@@ -65,25 +65,15 @@ TEST_F(Builtin, ANewWorkbookHasThreeSheetsThatTheBuildReducesToOne)
     EXPECT_EQ(failure([&] { app->Sheets()->Item(1)->Delete(); }),
         "The sheet \"CashFlow\" cannot be deleted: a workbook must keep at least one sheet.");
     EXPECT_NE(failure([&] { app->Sheets()->Item(2); }).find("has no sheet 2"), std::string::npos);
-    EXPECT_NE(failure([&] { app->Sheets()->Item(1)->setName("Cash/Flow"); }).find("cannot contain"), std::string::npos);
 }
 
-TEST_F(Builtin, HoldsItsSwitchesAndRefusesUnknownValues)
+TEST_F(Builtin, RefusesUnknownSwitchValuesAndStartsWithoutAPrintArea)
 {
-    app->setVisible(false);
-    app->setScreenUpdating(false);
-    app->setDisplayAlerts(false);
-    app->setEnableEvents(false);
-    app->setEnableCancelKey(xl::kCancelKeyDisabled);
-    app->setCursor(xl::kCursorWait);
-    EXPECT_FALSE(app->ScreenUpdating());
-    EXPECT_FALSE(app->DisplayAlerts());
-    EXPECT_FALSE(app->EnableEvents());
-    EXPECT_EQ(app->EnableCancelKey(), xl::kCancelKeyDisabled);
-    EXPECT_EQ(app->Cursor(), xl::kCursorWait);
-    EXPECT_DOUBLE_EQ(app->InchesToPoints(0.7), 50.4);
     EXPECT_NE(failure([&] { app->setCursor(99); }), "no error");
     EXPECT_NE(failure([&] { app->setEnableCancelKey(3); }), "no error");
+    EXPECT_DOUBLE_EQ(app->InchesToPoints(0.7), 50.4);
+    EXPECT_EQ(app->ActiveSheet()->PageSetup()->PrintArea(), "");
+    EXPECT_EQ(app->ActiveSheet()->PageSetup()->Zoom(), 100);
 }
 
 TEST_F(Builtin, ObjectsFailCleanlyOnceTheirWorkbookOrApplicationIsGone)
@@ -140,8 +130,6 @@ TEST_F(Builtin, SelectMovesTheSelectionAndTheActiveCell)
 
 TEST_F(Builtin, AddressesOutsideTheSheetAreRejectedByName)
 {
-    EXPECT_EQ(failure([&] { app->Range("IW1"); }),
-        "The address \"IW1\" is outside the sheet (columns A to IV, rows 1 to 65536).");
     EXPECT_EQ(failure([&] { app->Rows("65537"); }),
         "The address \"65537\" is outside the sheet (columns A to IV, rows 1 to 65536).");
     EXPECT_NE(failure([&] { app->Columns("A1B"); }).find("\"A1B\" is not a valid"), std::string::npos);
@@ -151,27 +139,18 @@ TEST_F(Builtin, AddressesOutsideTheSheetAreRejectedByName)
     EXPECT_EQ(app->Columns("B2:C9")->Address(), "$B:$C");
 }
 
+// What the sheet builder's frame reads back through the contract beyond what the whole-sheet
+// dumps of the report tests show: lines seen from the neighbouring cells, a block's inside
+// lines, and the used range once widths and heights reach A1.
 TEST_F(Builtin, TheTableFrameOfTheCashFlowSheet)
 {
-    app->Cells()->Select();
-    app->Cells()->Clear();
-    app->Selection()->Font()->setName("Arial");
-    app->Selection()->Interior()->setColorIndex(2);
-
     select("B4:P51");
     setAllBorders();
-    app->Selection()->setVerticalAlignment(xl::kAlignCenter);
     select("B4");
     clearBorder(xl::kEdgeTop);
-    clearBorder(xl::kEdgeLeft);
     select("C5:P53");
     app->Selection()->setNumberFormat("#,##0");
 
-    EXPECT_EQ(lineAt("B4", xl::kEdgeTop), xl::kLineStyleNone);
-    EXPECT_EQ(lineAt("B4", xl::kEdgeLeft), xl::kLineStyleNone);
-    EXPECT_EQ(lineAt("C4", xl::kEdgeTop), xl::kLineStyleContinuous);
-    EXPECT_EQ(lineAt("B5", xl::kEdgeLeft), xl::kLineStyleContinuous);
-    EXPECT_EQ(lineAt("P51", xl::kEdgeBottom), xl::kLineStyleContinuous);
     EXPECT_EQ(lineAt("P52", xl::kEdgeTop), xl::kLineStyleContinuous); // the line under P51
     EXPECT_EQ(lineAt("Q20", xl::kEdgeLeft), xl::kLineStyleContinuous);
     EXPECT_EQ(lineAt("Q20", xl::kEdgeRight), xl::kLineStyleNone);
@@ -179,28 +158,9 @@ TEST_F(Builtin, TheTableFrameOfTheCashFlowSheet)
     EXPECT_EQ(app->Range("C4")->Borders(xl::kEdgeTop)->Weight(), xl::kWeightThin);
     EXPECT_EQ(app->Range("B4")->Borders(xl::kEdgeTop)->ColorIndex(), xl::kColorIndexNone);
     EXPECT_EQ(app->Range("B4:C5")->Borders(xl::kInsideVertical)->LineStyle(), xl::kLineStyleContinuous);
-    EXPECT_EQ(app->Range("C53")->NumberFormat(), "#,##0");
-    EXPECT_EQ(app->Range("C54")->NumberFormat(), "General");
-    EXPECT_EQ(app->Range("P51")->VerticalAlignment(), xl::kAlignCenter);
-
-    // A spacer row loses its left, right and inner vertical lines, and nothing else.
-    app->Rows("20:20")->Select();
-    app->Selection()->setRowHeight(8);
-    clearBorder(xl::kEdgeLeft);
-    clearBorder(xl::kEdgeRight);
-    clearBorder(xl::kInsideVertical);
-    EXPECT_EQ(lineAt("B20", xl::kEdgeLeft), xl::kLineStyleNone);
-    EXPECT_EQ(lineAt("H20", xl::kEdgeRight), xl::kLineStyleNone);
-    EXPECT_EQ(lineAt("H20", xl::kEdgeTop), xl::kLineStyleContinuous);
-    EXPECT_EQ(lineAt("H21", xl::kEdgeLeft), xl::kLineStyleContinuous);
-    EXPECT_EQ(app->Range("H20")->RowHeight(), 8.0);
-
-    // Cells never touched show the whole-sheet format.
-    EXPECT_EQ(app->Range("Z1000")->Interior()->ColorIndex(), 2);
-    EXPECT_EQ(app->Range("IV65536")->Font()->Name(), "Arial");
 
     EXPECT_EQ(app->ActiveSheet()->UsedRange()->Address(), "$B$4:$P$53");
-    // With the widths of A to P and the heights of rows 1 to 4 set, it starts at A1.
+    // With the widths of A to P and the height of row 1 set, it starts at A1.
     for (int column = 1; column <= 16; ++column) {
         const std::string letter(1, static_cast<char>('A' + column - 1));
         app->Columns(letter + ":" + letter)->Select();
@@ -312,41 +272,6 @@ TEST_F(Builtin, PropertiesRejectValuesOutsideTheirRanges)
     };
     for (const auto& [action, message] : cases)
         EXPECT_NE(failure(action).find(message), std::string::npos) << message << ": " << failure(action);
-}
-
-TEST_F(Builtin, PageSetupIsHeldAndReadBack)
-{
-    auto page = app->ActiveSheet()->PageSetup();
-    EXPECT_EQ(page->PrintArea(), "");
-    EXPECT_EQ(page->Zoom(), 100);
-    page->setPrintArea("a1:p53");
-    app->ActiveSheet()->PageSetup()->setLeftMargin(app->InchesToPoints(0.7));
-    page->setTopMargin(app->InchesToPoints(0.5));
-    page->setHeaderMargin(0);
-    page->setPrintComments(xl::kPrintNoComments);
-    page->setOrientation(xl::kOrientationLandscape);
-    page->setPaperSize(xl::kPaperA4);
-    page->setZoom(std::nullopt);
-    page->setFitToPagesWide(1);
-    page->setFitToPagesTall(1);
-
-    auto again = app->ActiveSheet()->PageSetup();
-    EXPECT_EQ(again->PrintArea(), "$A$1:$P$53");
-    EXPECT_DOUBLE_EQ(again->LeftMargin(), 50.4);
-    EXPECT_DOUBLE_EQ(again->TopMargin(), 36.0);
-    EXPECT_DOUBLE_EQ(again->HeaderMargin(), 0.0);
-    EXPECT_EQ(again->Orientation(), xl::kOrientationLandscape);
-    EXPECT_EQ(again->PaperSize(), xl::kPaperA4);
-    EXPECT_EQ(again->Zoom(), std::nullopt);
-    EXPECT_EQ(again->FitToPagesTall(), 1);
-    EXPECT_EQ(again->PrintComments(), xl::kPrintNoComments);
-}
-
-TEST_F(Builtin, PaletteEntriesAreWritableThroughTheWorkbook)
-{
-    book->setColors(12, 0x5F5237);
-    EXPECT_EQ(app->ActiveWorkbook()->Colors(12), 0x5F5237u);
-    EXPECT_EQ(app->Workbooks()->Item(1)->Colors(2), 0xFFFFFFu);
 }
 
 // Hands back a picture whose size tells what was asked, and what D1 showed when it was asked.
