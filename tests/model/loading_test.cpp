@@ -31,20 +31,6 @@ TEST(LoadOptions, FirstStartShowsTheDefaultsByMonth)
     EXPECT_TRUE(model.store.entries().empty()) << "loading writes nothing";
 }
 
-TEST(LoadOptions, FillsThePalette)
-{
-    ModelHarness model;
-    model.options.LoadOptions(LoadMode::FromStore);
-    const PaletteTable& palette = model.options.palette();
-    EXPECT_EQ(palette[0].value(), 0u);
-    EXPECT_EQ(palette[1].value(), 0xFFFFFFu);
-    EXPECT_EQ(palette[4].value(), 104u + 150u * 256u + 206u * 65536u);
-    EXPECT_EQ(palette[17], (PaletteColour { 8, 132, 131 }));
-    EXPECT_EQ(palette[42], (PaletteColour { 177, 255, 209 }));
-    EXPECT_EQ(palette[54], (PaletteColour { 204, 255, 204 }));
-    EXPECT_EQ(palette[55], (PaletteColour { 51, 51, 51 }));
-}
-
 TEST(LoadOptions, ReadsAStoredListWithItsFlags)
 {
     ModelHarness model;
