@@ -178,41 +178,22 @@ TEST_F(Builtin, TheTableFrameOfTheCashFlowSheet)
     EXPECT_EQ(app->Range("Q1")->ColumnWidth(), 8.43);
 }
 
-TEST_F(Builtin, FormatsOfWholeRowsAndColumnsReachCellsCreatedLater)
+// Where row and column formats meet is the sheet format tests' concern; here, the names of
+// font styles.
+TEST_F(Builtin, FontStylesGoByTheApplicationsNames)
 {
-    app->Columns("D:D")->Select();
-    app->Selection()->Interior()->setColorIndex(43);
     app->Rows("6:6")->Select();
     app->Selection()->Font()->setFontStyle("Bold");
-    app->Selection()->Font()->setSize(9);
-
-    // Where they meet, the cell has both.
-    EXPECT_EQ(app->Range("D6")->Font()->FontStyle(), "Bold");
-    EXPECT_EQ(app->Range("D6")->Interior()->ColorIndex(), 43);
-    EXPECT_EQ(app->Range("D7")->Interior()->ColorIndex(), 43);
-    EXPECT_EQ(app->Range("X6")->Font()->Size(), 9.0);
+    EXPECT_EQ(app->Range("X6")->Font()->FontStyle(), "Bold");
     EXPECT_EQ(app->Range("X7")->Font()->FontStyle(), "Regular");
-
-    app->Range("D7")->setFormulaR1C1("5");
-    EXPECT_EQ(app->Range("D7")->Interior()->ColorIndex(), 43);
     EXPECT_EQ(failure([&] { app->Selection()->Font()->setFontStyle("Heavy"); }),
         "The font style \"Heavy\" is not one of Regular, Bold, Italic and Bold Italic.");
 }
 
-TEST_F(Builtin, CellEntryFollowsTheApplicationsRules)
+// How typed text becomes content is the cell entry tests' concern; here, that an entry
+// recalculates its dependants and that a refused formula leaves the cell as it was.
+TEST_F(Builtin, EntriesRecalculateTheirDependantsAndRefusedOnesChangeNothing)
 {
-    putCell("P2", "1/1/2013");
-    EXPECT_EQ(app->Range("P2")->Value(), xl::Value(41275.0));
-    EXPECT_EQ(app->Range("P2")->NumberFormat(), "m/d/yyyy");
-    app->Selection()->setNumberFormat("mmm-yy");
-    EXPECT_EQ(app->Range("P2")->FormulaR1C1(), "1/1/2013");
-
-    putCell("D4", "=R[-2]C[12]");
-    EXPECT_EQ(app->Range("D4")->Value(), xl::Value(41275.0));
-    putCell("E4", "=DATE(YEAR(RC[-1]),MONTH(RC[-1])+1,1)");
-    EXPECT_EQ(app->Range("E4")->Value(), xl::Value(41306.0));
-    EXPECT_EQ(app->Range("E4")->FormulaR1C1(), "=DATE(YEAR(RC[-1]),MONTH(RC[-1])+1,1)");
-
     putCell("C7", "2013");
     putCell("C8", "=R[-1]C[0]+1");
     EXPECT_EQ(app->Range("C8")->Value(), xl::Value(2014.0));
@@ -222,15 +203,6 @@ TEST_F(Builtin, CellEntryFollowsTheApplicationsRules)
     putCell("C7", "Week 1");
     EXPECT_EQ(app->Range("C8")->Value(), xl::Value(xl::ErrorValue::Value));
 
-    putCell("C9", "10%");
-    EXPECT_EQ(app->Range("C9")->NumberFormat(), "0%");
-    EXPECT_EQ(app->Range("C9")->FormulaR1C1(), "10%");
-
-    // Labels are kept as they stand.
-    for (const char* label : { "=1+1", "1-2", "10%", "2013", "'quoted" }) {
-        app->Range("B10")->setLiteralText(label);
-        EXPECT_EQ(app->Range("B10")->Value(), xl::Value(std::string(label)));
-    }
     EXPECT_EQ(failure([&] { app->Range("B11")->setFormulaR1C1("=SUM(R1C1"); }),
         "The formula \"=SUM(R1C1\" is not valid: the call of SUM is never closed.");
     EXPECT_EQ(app->Range("B11")->Value(), xl::Value());
@@ -263,7 +235,6 @@ TEST_F(Builtin, PropertiesRejectValuesOutsideTheirRanges)
         { [&] { app->Range("A65536:B65536")->Item(3); }, "has no item 3" },
         { [&] { book->Colors(57); }, "The colour index 57 is outside the palette (1 to 56)." },
         { [&] { book->SaveAs("no such folder/out.xls"); }, "cannot be saved as \"no such folder/out.xls\"" },
-        { [&] { app->Workbooks()->Open("no such folder/in.xls"); }, "\"no such folder/in.xls\" cannot be opened" },
         { [&] { app->Range("A1")->CopyPicture(); }, "no sheet pictures" },
         { [&] { app->ActiveSheet()->PageSetup()->setZoom(5); }, "zoom of 5%" },
         { [&] { app->ActiveSheet()->PageSetup()->setOrientation(3); }, "page orientation 3" },
