@@ -1,7 +1,8 @@
 #include "automation/contract/error.h"
 #include "spreadsheet/picture/bmpfile.h"
-#include "spreadsheet/picture/enginepicturerenderer.h"
+#include "spreadsheet/picture/qttextmetrics.h"
 #include "spreadsheet/picture/sheetpainter.h"
+#include "tests/picture_layout/syntheticregion.h"
 
 #include <gtest/gtest.h>
 
@@ -11,34 +12,11 @@ namespace {
 // Paints small synthetic sheets and probes pixels; paint_main.cpp provides the application.
 class PaintTest : public ::testing::Test {
 protected:
-    // Columns of 10 characters (75 pixels) and rows of 15 points (20 pixels), with the
-    // palette colours k * 0x030507 so that every index is told apart.
-    void makeSheet(int rows, int columns)
-    {
-        region = SheetRegion {};
-        region.columnWidths.assign(static_cast<std::size_t>(columns), 10.0);
-        region.rowHeights.assign(static_cast<std::size_t>(rows), 15.0);
-        for (std::size_t k = 0; k < region.palette.size(); ++k) {
-            region.palette[k] = static_cast<std::uint32_t>(k + 1) * 0x030507u;
-        }
-        region.formatIds.assign(static_cast<std::size_t>(rows * columns), 0);
-    }
-
-    void setFormat(int row, int column, const CellFormat& format)
-    {
-        region.formats.push_back(format);
-        region.formatIds[static_cast<std::size_t>(row) * region.columnWidths.size() + static_cast<std::size_t>(column)]
-            = static_cast<std::uint32_t>(region.formats.size() - 1);
-    }
-
-    void setValue(int row, int column, const xl::Value& value)
-    {
-        CellValue cell;
-        cell.row = row;
-        cell.column = column;
-        cell.value = value;
-        region.values.push_back(cell);
-    }
+    // Columns of 10 characters (75 pixels) and rows of 15 points (20 pixels), every palette
+    // index a colour of its own.
+    void makeSheet(int rows, int columns) { region = test::syntheticRegion(rows, columns); }
+    void setFormat(int row, int column, const CellFormat& format) { test::setCellFormat(region, row, column, format); }
+    void setValue(int row, int column, const xl::Value& value) { test::setCellValue(region, row, column, value); }
 
     QImage paint() const { return toImage(paintSheetRegion(region)); }
 
@@ -116,24 +94,6 @@ TEST_F(PaintTest, TextInkStaysInItsCellOrSpillsIntoEmptyNeighbours)
     EXPECT_GT(inkIn(image, QRect(1, 41, 74, 19)), 20);
 }
 
-TEST_F(PaintTest, NumbersThatDoNotFitShowHashSigns)
-{
-    makeSheet(2, 1);
-    region.columnWidths = { 5.0 }; // 40 pixels
-    CellFormat thousands;
-    thousands.numberFormat = "#,##0";
-    setFormat(0, 0, thousands);
-    setFormat(1, 0, thousands);
-    setValue(0, 0, 12.0);
-    setValue(1, 0, 123456789.0);
-    const QImage image = paint();
-    // A fitting number leaves the left of its box blank; hash signs fill the box.
-    EXPECT_EQ(inkIn(image, QRect(3, 1, 15, 19)), 0);
-    EXPECT_GT(inkIn(image, QRect(26, 1, 12, 19)), 5);
-    EXPECT_GT(inkIn(image, QRect(3, 21, 15, 19)), 10);
-    EXPECT_GT(inkIn(image, QRect(26, 21, 12, 19)), 10);
-}
-
 TEST_F(PaintTest, FontColourAndFormatColour)
 {
     makeSheet(2, 1);
@@ -181,25 +141,6 @@ TEST_F(PaintTest, PngAndBitmapFilesReadBackAsPainted)
         EXPECT_EQ(loaded.convertToFormat(QImage::Format_RGB32), painted.convertToFormat(QImage::Format_RGB32)) << name;
     }
     EXPECT_THROW(encodePng(xl::Picture {}), xl::Error);
-}
-
-TEST_F(PaintTest, RendererPaintsTheBlockOfAWorkbookSheet)
-{
-    engine::Workbook workbook;
-    engine::Sheet& sheet = workbook.addSheet("CashFlow");
-    sheet.setColumnWidth(2, 32.0);
-    sheet.setRowHeight(2, 27.75);
-    engine::CellStyle shaded;
-    shaded.fillColorIndex = 55;
-    sheet.setCellStyle({ 2, 2 }, workbook.styles().intern(shaded));
-
-    EnginePictureRenderer renderer;
-    const xl::Picture picture = renderer.renderPicture(workbook, sheet, { 1, 1, 2, 2 });
-    EXPECT_EQ(picture.width, 64 + 229 + 1);
-    EXPECT_EQ(picture.height, 17 + 37 + 1);
-    const QImage image = toImage(picture);
-    EXPECT_EQ(image.pixel(64 + 114, 17 + 18) & 0xFFFFFF, paletteRgb(workbook.palette()[54]));
-    EXPECT_EQ(image.pixel(32, 8) & 0xFFFFFF, kPageColor);
 }
 
 } // namespace

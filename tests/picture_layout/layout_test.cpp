@@ -1,7 +1,9 @@
 #include "spreadsheet/picture/picturelayout.h"
 #include "tests/picture_layout/fakemetrics.h"
+#include "tests/picture_layout/syntheticregion.h"
 
 #include <algorithm>
+#include <iterator>
 
 #include <gtest/gtest.h>
 
@@ -16,36 +18,10 @@ class LayoutTest : public ::testing::Test {
 protected:
     void makeSheet(int rows, int columns, double width = 10.0, double height = 15.0)
     {
-        region = SheetRegion {};
-        region.columnWidths.assign(static_cast<std::size_t>(columns), width);
-        region.rowHeights.assign(static_cast<std::size_t>(rows), height);
-        for (std::size_t k = 0; k < region.palette.size(); ++k) {
-            region.palette[k] = static_cast<std::uint32_t>(k + 1) * 0x010203u; // distinct, recognisable
-        }
+        region = test::syntheticRegion(rows, columns, width, height);
     }
-
-    void setFormat(int row, int column, const CellFormat& format)
-    {
-        if (region.formatIds.empty()) {
-            region.formatIds.assign(region.rowHeights.size() * region.columnWidths.size(), 0);
-        }
-        auto found = std::find(region.formats.begin(), region.formats.end(), format);
-        if (found == region.formats.end()) {
-            region.formats.push_back(format);
-            found = region.formats.end() - 1;
-        }
-        region.formatIds[static_cast<std::size_t>(row) * region.columnWidths.size() + static_cast<std::size_t>(column)]
-            = static_cast<std::uint32_t>(found - region.formats.begin());
-    }
-
-    void setValue(int row, int column, const xl::Value& value)
-    {
-        CellValue cell;
-        cell.row = row;
-        cell.column = column;
-        cell.value = value;
-        region.values.push_back(cell);
-    }
+    void setFormat(int row, int column, const CellFormat& format) { test::setCellFormat(region, row, column, format); }
+    void setValue(int row, int column, const xl::Value& value) { test::setCellValue(region, row, column, value); }
 
     PictureLayout layout() const { return layOutPicture(region, metrics); }
 
