@@ -69,8 +69,13 @@ void TemplateBuild::writeTemporaryWorkbook(StatementRunner& statements)
     statements.run(138, [&] { app().setEnableCancelKey(xl::kCancelKeyInterrupt); });
 
     statements.run(140, [&] { m_temporaryWorkbook = claimTemporaryWorkbook(m_setup.temporaryFolder, m_setup.random); });
-    statements.run(
+    const bool saved = statements.run(
         142, [&] { existing(m_buildWorkbook, "build workbook").SaveAs(utf8Text(claimed(m_temporaryWorkbook))); });
+    if (!saved && !m_temporaryWorkbook.empty()) {
+        // An unfilled claim must not pass for a workbook: saving the results from the preview
+        // would copy the empty file and report success.
+        DeleteFile(m_temporaryWorkbook);
+    }
     statements.run(144, [&] { app().setDisplayAlerts(false); });
     statements.run(146, [&] { existing(m_buildWorkbook, "build workbook").Close(); });
     statements.run(148, [&] { app().Quit(); });

@@ -160,10 +160,12 @@ TEST_F(GenerateReport0Test, WithoutASpreadsheetApplicationReportsEachLaterStepAn
         "Please email screenshot of this message to support@penmoor.example");
     EXPECT_EQ(first.title, "Application Error");
     EXPECT_EQ(first.icon, MessageIcon::Exclamation);
-    // The preview takes the claimed (empty) temporary workbook, which it deletes when left.
+    // The preview still takes the temporary workbook's name, but the claim that no save filled
+    // is gone, so saving the results reports the missing file instead of copying an empty one.
     EXPECT_EQ(windowLog,
         (std::vector<std::string> {
             "pointer 11", "pointer 0", "preview path qarnet55555555.xls", "preview show", "hide" }));
+    EXPECT_FALSE(fs::exists(temporaryWorkbook()));
     EXPECT_FALSE(fs::exists(pictureFolder()));
     EXPECT_TRUE(driver.sharedApplication().isEmpty());
 }
