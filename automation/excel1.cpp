@@ -1,7 +1,7 @@
 #include "automation/excel1.h"
 
 #include "automation/picturefile.h"
-#include "automation/utf8path.h"
+#include "shell/utf8path.h"
 
 namespace penmoor {
 

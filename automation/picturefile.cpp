@@ -1,6 +1,6 @@
 #include "automation/picturefile.h"
 
-#include "automation/utf8path.h"
+#include "shell/utf8path.h"
 #include "spreadsheet/picture/bmpfile.h"
 
 #include <cerrno>

@@ -1,6 +1,6 @@
 #include "automation/privatefolder.h"
 
-#include "automation/newentry.h"
+#include "shell/newentry.h"
 
 #include <algorithm>
 #include <string>

@@ -5,9 +5,9 @@
 #include "automation/existing.h"
 #include "automation/picturefile.h"
 #include "automation/temporaryworkbook.h"
-#include "automation/utf8path.h"
 #include "report/twelvemonthcashflow.h"
 #include "shell/fileutils.h"
+#include "shell/utf8path.h"
 
 namespace penmoor {
 

@@ -1,6 +1,6 @@
 #include "automation/temporaryworkbook.h"
 
-#include "automation/newentry.h"
+#include "shell/newentry.h"
 
 #include <algorithm>
 

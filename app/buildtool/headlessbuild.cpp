@@ -3,7 +3,7 @@
 #include "automation/excel1.h"
 #include "automation/statements.h"
 #include "automation/templatebuild.h"
-#include "automation/utf8path.h"
+#include "shell/utf8path.h"
 #include "model/memorysettingsstore.h"
 #include "model/memorywindowview.h"
 #include "model/options.h"

@@ -2,7 +2,7 @@
 
 #include "app/buildtool/buildrequest.h"
 #include "app/buildtool/utf8text.h"
-#include "automation/utf8path.h"
+#include "shell/utf8path.h"
 #include "model/defaultlist.h"
 #include "model/itemrules.h"
 #include "model/namematching.h"

@@ -1,6 +1,6 @@
 #include "app/buildtool/outputpaths.h"
 
-#include "automation/utf8path.h"
+#include "shell/utf8path.h"
 
 #include <algorithm>
 #include <cctype>

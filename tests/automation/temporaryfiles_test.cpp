@@ -1,6 +1,6 @@
-#include "automation/newentry.h"
 #include "automation/privatefolder.h"
 #include "automation/temporaryworkbook.h"
+#include "shell/newentry.h"
 #include "tests/automation/scriptedrandom.h"
 #include "tests/support/temporaryfolder.h"
 

@@ -96,5 +96,20 @@ TEST_F(FileReplaceTest, AFolderThatMayNotBeWrittenKeepsItsFile)
     EXPECT_EQ(namesIn(locked), std::set<std::string>({ "plan.xls" }));
 }
 
+TEST_F(FileReplaceTest, TheSuccessorKeepsWhoMayReadTheFileItReplaces)
+{
+#ifdef _WIN32
+    GTEST_SKIP() << "Windows files take their folder's access list";
+#endif
+    const fs::path target = folder / "private.xls";
+    writeFile(target, "mine alone");
+    const fs::perms ownerOnly = fs::perms::owner_read | fs::perms::owner_write;
+    fs::permissions(target, ownerOnly);
+
+    EXPECT_FALSE(replaceFileContents(target, bytes));
+    EXPECT_EQ(fs::status(target).permissions(), ownerOnly);
+    EXPECT_EQ(readFile(target), asText);
+}
+
 } // namespace
 } // namespace penmoor

@@ -20,6 +20,10 @@ enum class NewEntry {
 // read and write it.
 NewEntry createNewFile(const std::filesystem::path& path, std::error_code& error);
 
+// The same with the given permissions, less those the process's file creation mask withholds.
+// On Windows the file takes the access list of its folder instead.
+NewEntry createNewFile(const std::filesystem::path& path, std::filesystem::perms access, std::error_code& error);
+
 // Creates a folder at path that only the user can enter, read and write, failing in the same
 // way when anything of that name exists.
 NewEntry createPrivateFolder(const std::filesystem::path& path, std::error_code& error);

@@ -1,7 +1,7 @@
 // Platform file: exclusive creation of files and folders on POSIX and Windows.
-#include "automation/newentry.h"
+#include "shell/newentry.h"
 
-#include "automation/utf8path.h"
+#include "shell/utf8path.h"
 
 #include <stdexcept>
 
@@ -39,7 +39,7 @@ NewEntry outcome(BOOL succeeded, std::error_code& error)
 
 } // namespace
 
-NewEntry createNewFile(const std::filesystem::path& path, std::error_code& error)
+NewEntry createNewFile(const std::filesystem::path& path, std::filesystem::perms, std::error_code& error)
 {
     const HANDLE file
         = CreateFileW(path.c_str(), GENERIC_WRITE, 0, nullptr, CREATE_NEW, FILE_ATTRIBUTE_NORMAL, nullptr);
@@ -78,10 +78,11 @@ NewEntry outcome(bool succeeded, std::error_code& error)
 
 } // namespace
 
-NewEntry createNewFile(const std::filesystem::path& path, std::error_code& error)
+NewEntry createNewFile(const std::filesystem::path& path, std::filesystem::perms access, std::error_code& error)
 {
     // O_EXCL also refuses a symbolic link of that name, dangling or not.
-    const int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, S_IRUSR | S_IWUSR);
+    const int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC,
+        static_cast<mode_t>(access & std::filesystem::perms::mask));
     const NewEntry result = outcome(file >= 0, error);
     if (file >= 0) {
         ::close(file);
@@ -95,6 +96,12 @@ NewEntry createPrivateFolder(const std::filesystem::path& path, std::error_code&
 }
 
 #endif
+
+NewEntry createNewFile(const std::filesystem::path& path, std::error_code& error)
+{
+    using std::filesystem::perms;
+    return createNewFile(path, perms::owner_read | perms::owner_write, error);
+}
 
 std::filesystem::path createUnderFreshName(const std::filesystem::path& folder,
     const std::function<std::string()>& drawName, NewEntry (*create)(const std::filesystem::path&, std::error_code&),
