@@ -6,6 +6,7 @@
 #include <optional>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace penmoor {
@@ -15,6 +16,12 @@ class UsageError : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;
 };
+
+// A piece of the user's input as a refusal shows it.
+inline std::string inQuotes(std::string_view text)
+{
+    return "\"" + std::string(text) + "\"";
+}
 
 // The most a cell takes, in bytes of UTF-8 text: longer names are refused up front rather
 // than failing half-way through the build.

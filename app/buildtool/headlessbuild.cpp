@@ -1,9 +1,9 @@
 #include "app/buildtool/headlessbuild.h"
 
+#include "app/buildtool/outputpaths.h"
 #include "automation/excel1.h"
 #include "automation/statements.h"
 #include "automation/templatebuild.h"
-#include "shell/utf8path.h"
 #include "model/memorysettingsstore.h"
 #include "model/memorywindowview.h"
 #include "model/options.h"
@@ -12,6 +12,7 @@
 #include "shell/filereplace.h"
 #include "shell/fileutils.h"
 #include "shell/unitrandom.h"
+#include "shell/utf8path.h"
 
 #include <stdexcept>
 
@@ -32,9 +33,10 @@ public:
     void adopt(fs::path path) { m_path = std::move(path); }
     const fs::path& path() const { return m_path; }
 
-    // Moves the file over target in one step.
+    // Moves the file over target in one step; it takes the permissions a file there would have.
     void place(const fs::path& target)
     {
+        giveAccessOf(target, m_path);
         if (const std::error_code error = moveFileOver(m_path, target)) {
             throw std::runtime_error("Could not write \"" + utf8Text(target) + "\": " + error.message() + ".");
         }
@@ -44,11 +46,6 @@ public:
 private:
     fs::path m_path;
 };
-
-fs::path folderOf(const fs::path& path)
-{
-    return path.has_parent_path() ? path.parent_path() : fs::path(".");
-}
 
 // The item list goes in through the settings store, the way the program restores a list
 // from its last run.
@@ -135,7 +132,15 @@ void runHeadlessBuild(
                 "Could not write \"" + utf8Text(*request.picture) + "\": " + error.message() + ".");
         }
     }
-    workbook.place(request.output);
+    try {
+        workbook.place(request.output);
+    } catch (...) {
+        // A picture without its workbook is no result.
+        if (request.picture) {
+            DeleteFile(*request.picture);
+        }
+        throw;
+    }
 }
 
 } // namespace penmoor

@@ -2,11 +2,11 @@
 
 #include "app/buildtool/buildrequest.h"
 #include "app/buildtool/utf8text.h"
-#include "shell/utf8path.h"
 #include "model/defaultlist.h"
 #include "model/itemrules.h"
 #include "model/namematching.h"
 #include "model/templateitem.h"
+#include "shell/utf8path.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -22,11 +22,6 @@ namespace {
 // The editor refuses shorter names.
 constexpr std::size_t kShortestName = 3;
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
-
-std::string inQuotes(std::string_view text)
-{
-    return "\"" + std::string(text) + "\"";
-}
 
 UsageError lineProblem(std::size_t line, const std::string& problem)
 {

@@ -24,11 +24,6 @@ bool endsWith(const fs::path& path, std::string_view extension)
 }
 
 // The folder a relative name such as "plan.xls" goes to.
-fs::path folderOf(const fs::path& path)
-{
-    return path.has_parent_path() ? path.parent_path() : fs::path(".");
-}
-
 void checkOutput(const fs::path& path, std::string_view option, std::string_view extension, std::string_view kind)
 {
     const std::string shown = std::string(option) + " \"" + utf8Text(path) + "\": ";
@@ -46,6 +41,11 @@ void checkOutput(const fs::path& path, std::string_view option, std::string_view
 }
 
 } // namespace
+
+fs::path folderOf(const fs::path& path)
+{
+    return path.has_parent_path() ? path.parent_path() : fs::path(".");
+}
 
 void checkOutputPaths(const BuildRequest& request)
 {

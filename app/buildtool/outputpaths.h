@@ -9,4 +9,7 @@ namespace penmoor {
 // existing folder, and not both to the same file.
 void checkOutputPaths(const BuildRequest& request);
 
+// The folder a file named by path goes into: the current folder for a bare name.
+std::filesystem::path folderOf(const std::filesystem::path& path);
+
 } // namespace penmoor

@@ -32,11 +32,6 @@ std::optional<int> wholeNumber(std::string_view text)
     return value;
 }
 
-std::string inQuotes(std::string_view text)
-{
-    return "\"" + std::string(text) + "\"";
-}
-
 } // namespace
 
 int checkedYear(std::string_view text, std::string_view option)
