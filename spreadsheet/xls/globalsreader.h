@@ -34,7 +34,6 @@ public:
     // Print areas by worksheet index, 0-based rows and columns.
     const std::map<int, CellArea>& printAreas() const { return m_printAreas; }
 
-    std::size_t xfCount() const { return m_xfs.size(); }
     // The model's format for an XF, interned in `styles` on first use; FormatError for an XF,
     // font or colour the file does not define.
     engine::StyleId style(std::uint16_t xf, engine::StyleTable& styles);
