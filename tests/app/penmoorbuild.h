@@ -2,7 +2,6 @@
 
 #include "tests/xls/support/readers.h"
 
-#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -14,17 +13,6 @@ inline xls::test::CommandResult runPenmoorBuild(const std::vector<std::string>& 
     std::vector<std::string> words { PENMOOR_BUILD_PROGRAM };
     words.insert(words.end(), arguments.begin(), arguments.end());
     return xls::test::runCommand(words, 120);
-}
-
-// The names in a folder, sorted.
-inline std::vector<std::string> folderContents(const std::filesystem::path& folder)
-{
-    std::vector<std::string> names;
-    for (const std::filesystem::directory_entry& entry : std::filesystem::directory_iterator(folder)) {
-        names.push_back(entry.path().filename().string());
-    }
-    std::sort(names.begin(), names.end());
-    return names;
 }
 
 } // namespace penmoor::testing

@@ -1,7 +1,6 @@
 #include "tests/app/penmoorbuild.h"
 #include "tests/support/temporaryfolder.h"
-
-#include <fstream>
+#include "tests/xls/support/files.h"
 
 #include <gtest/gtest.h>
 
@@ -9,15 +8,11 @@ namespace penmoor {
 namespace {
 
 namespace fs = std::filesystem;
-using testing::folderContents;
 using testing::runPenmoorBuild;
 using testing::TemporaryFolder;
-
-std::string readText(const fs::path& path)
-{
-    std::ifstream in(path, std::ios::binary);
-    return { std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>() };
-}
+using xls::test::folderContents;
+using xls::test::readFile;
+using xls::test::writeFile;
 
 TEST(PenmoorBuildCli, HelpDocumentsTheInterfaceAndWritesNothing)
 {
@@ -31,21 +26,16 @@ TEST(PenmoorBuildCli, RefusesBadInputWithStatusTwoBeforeWritingAnything)
 {
     TemporaryFolder folder;
     const std::string out = (folder / "plan.xls").string();
-    std::ofstream(folder / "items.txt") << "Cash on Hand (beginning of month)\nab\n";
+    writeFile(folder / "items.txt", "Cash on Hand (beginning of month)\nab\n");
+    // One refusal of each kind; the command line tests check every message.
     struct Case {
         std::vector<std::string> args;
         std::string problem;
     };
     const std::vector<Case> cases = {
-        { { "--by-year", "2015", "2013", "-o", out }, "--by-year: the first year 2015 is after the last year 2013." },
         { { "--by-week", "0", "-o", out }, "--by-week: \"0\" is not a number of weeks from 1 to 100." },
-        { { "--by-month", "2013", "2030", "-o", out }, "--by-month: the last year may be at most 10 years" },
         { { "--items", (folder / "items.txt").string(), "-o", out }, "line 2: the name \"ab\" is shorter than 3" },
-        { { "--items", (folder / "none.txt").string(), "-o", out }, "No such file or directory" },
         { { "-o", (folder / "missing" / "plan.xls").string() }, "/missing\" does not exist." },
-        { { "--company", "Harlenby" }, "-o is missing" },
-        { { "-o", out, "--colour", "red" }, "unknown option \"--colour\"." },
-        { { "-o", out, "--picture", (folder / "plan.bmp").string() }, "the name must end in .png" },
     };
     for (const Case& c : cases) {
         const auto result = runPenmoorBuild(c.args);
@@ -60,19 +50,22 @@ TEST(PenmoorBuildCli, RefusesBadInputWithStatusTwoBeforeWritingAnything)
 TEST(PenmoorBuildCli, WritesTheWorkbookAndNothingElse)
 {
     TemporaryFolder folder;
-    std::ofstream(folder / "plan.xls") << "an older plan";
+    writeFile(folder / "plan.xls", "an older plan");
     const auto result = runPenmoorBuild({ "--company", "Harlenby", "-o", (folder / "plan.xls").string() });
     EXPECT_EQ(result.exitCode, 0) << result.errors;
     EXPECT_EQ(result.errors, "");
     EXPECT_EQ(folderContents(folder.path()), (std::vector<std::string> { "plan.xls" }));
     // Replaced by a compound file, which starts with its signature.
-    EXPECT_EQ(readText(folder / "plan.xls").substr(0, 8), "\xD0\xCF\x11\xE0\xA1\xB1\x1A\xE1");
+    const auto written = readFile(folder / "plan.xls");
+    ASSERT_GE(written.size(), 8u);
+    EXPECT_EQ(std::vector(written.begin(), written.begin() + 8),
+        (std::vector<std::uint8_t> { 0xD0, 0xCF, 0x11, 0xE0, 0xA1, 0xB1, 0x1A, 0xE1 }));
 }
 
 TEST(PenmoorBuildCli, AFailingBuildExitsWithStatusOneAndLeavesNoPartialOutput)
 {
     TemporaryFolder folder;
-    std::ofstream(folder / "plan.xls") << "an older plan";
+    writeFile(folder / "plan.xls", "an older plan");
     // Nothing can be created in /proc, so the picture fails after the workbook was saved.
     const auto result
         = runPenmoorBuild({ "--picture", "/proc/penmoor-build-test.png", "-o", (folder / "plan.xls").string() });
@@ -82,7 +75,7 @@ TEST(PenmoorBuildCli, AFailingBuildExitsWithStatusOneAndLeavesNoPartialOutput)
         0u)
         << result.errors;
     EXPECT_EQ(folderContents(folder.path()), (std::vector<std::string> { "plan.xls" }));
-    EXPECT_EQ(readText(folder / "plan.xls"), "an older plan");
+    EXPECT_EQ(readFile(folder / "plan.xls"), xls::test::bytesOf("an older plan"));
 }
 
 } // namespace

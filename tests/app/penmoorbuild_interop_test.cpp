@@ -1,9 +1,9 @@
 #include "model/defaultlist.h"
 #include "tests/app/penmoorbuild.h"
 #include "tests/support/temporaryfolder.h"
+#include "tests/xls/support/files.h"
 
 #include <cmath>
-#include <fstream>
 #include <map>
 #include <sstream>
 
@@ -166,11 +166,11 @@ TEST_F(PenmoorBuildInterop, ByYearWithAnEditedListOpensAndAddsUpElsewhere)
     items.insert(items.begin() + 4, "  Grants (leading blanks)");
     items.insert(items.begin() + 5, "=1+1");
     items.insert(items.begin() + 6, "Miete & Nebenkosten (€)");
-    std::ofstream list(m_folder / "items.txt", std::ios::binary);
+    std::string list;
     for (const std::string& item : items) {
-        list << item << "\n";
+        list += item + "\n";
     }
-    list.close();
+    reader::writeFile(m_folder / "items.txt", list);
 
     const fs::path file = build(
         { "--company", "Harlenby & Söhne", "--by-year", "1990", "2000", "--items", (m_folder / "items.txt").string() });
@@ -226,13 +226,12 @@ TEST_F(PenmoorBuildInterop, WritesThePictureAsPng)
 {
     const fs::path picture = m_folder / "plan.png";
     build({ "--picture", picture.string() });
-    std::ifstream in(picture, std::ios::binary);
-    const std::string bytes { std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>() };
+    const std::vector<std::uint8_t> bytes = reader::readFile(picture);
     ASSERT_GT(bytes.size(), 24u);
-    EXPECT_EQ(bytes.substr(0, 8), "\x89PNG\r\n\x1A\n");
+    EXPECT_EQ(std::vector(bytes.begin(), bytes.begin() + 8),
+        (std::vector<std::uint8_t> { 0x89, 'P', 'N', 'G', '\r', '\n', 0x1A, '\n' }));
     const auto big = [&](std::size_t at) {
-        return (static_cast<unsigned char>(bytes[at]) << 24) | (static_cast<unsigned char>(bytes[at + 1]) << 16)
-            | (static_cast<unsigned char>(bytes[at + 2]) << 8) | static_cast<unsigned char>(bytes[at + 3]);
+        return (bytes[at] << 24) | (bytes[at + 1] << 16) | (bytes[at + 2] << 8) | bytes[at + 3];
     };
     // A sheet of sixteen columns and some fifty rows is wider than tall, and no thumbnail.
     EXPECT_GT(big(16), 800);
