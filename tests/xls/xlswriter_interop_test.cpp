@@ -1,6 +1,7 @@
 // Our files read by someone else: python3-xlrd reads the content and formatting the model holds,
 // Gnumeric and LibreOffice recalculate every formula to the value the model cached, LibreOffice
 // reads the page setup, and our reader reads what LibreOffice saves.
+#include "spreadsheet/formula/valuetext.h"
 #include "spreadsheet/xls/biffrecords.h"
 #include "spreadsheet/xls/compoundfilewriter.h"
 #include "spreadsheet/xls/recordreader.h"
@@ -126,27 +127,6 @@ std::vector<std::vector<std::string>> parseCsv(const std::string& text)
     return rows;
 }
 
-const char* errorText(xl::ErrorValue error)
-{
-    switch (error) {
-    case xl::ErrorValue::Null:
-        return "#NULL!";
-    case xl::ErrorValue::Div0:
-        return "#DIV/0!";
-    case xl::ErrorValue::Value:
-        return "#VALUE!";
-    case xl::ErrorValue::Ref:
-        return "#REF!";
-    case xl::ErrorValue::Name:
-        return "#NAME?";
-    case xl::ErrorValue::Num:
-        return "#NUM!";
-    case xl::ErrorValue::NA:
-        return "#N/A";
-    }
-    return "?";
-}
-
 bool sameNumber(double expected, const std::string& text)
 {
     char* end = nullptr;
@@ -212,7 +192,7 @@ TEST(XlsInterop, GnumericRecalculatesToTheCachedResults)
         } else if (const bool* flag = std::get_if<bool>(&cached)) {
             EXPECT_EQ(shown, *flag ? "TRUE" : "FALSE") << where;
         } else if (const xl::ErrorValue* error = std::get_if<xl::ErrorValue>(&cached)) {
-            EXPECT_EQ(shown, errorText(*error)) << where;
+            EXPECT_EQ(shown, engine::errorText(*error)) << where;
         }
         ++checked;
     });
