@@ -14,8 +14,8 @@ packages=(
     fonts-liberation
     # independent readers of the .xls files, used by the format tests
     python3 python3-xlrd python3-olefile gnumeric libreoffice-calc-nogui
-    # looking at the program: a virtual display, screenshots, PDF to PNG
-    xvfb xauth x11-apps imagemagick poppler-utils
+    # looking at the program: a virtual display, screenshots, PDF to PNG, driving it by mouse
+    xvfb xauth x11-apps imagemagick poppler-utils xdotool
     # Windows build of the core, run under Wine
     g++-mingw-w64-x86-64-posix wine64
     # benchmarks: peers and whole-process timing
