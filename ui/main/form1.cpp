@@ -162,6 +162,12 @@ void Form1::layOutControls()
     periodLayout->setColumnMinimumWidth(0, option(OptionButton::Option3)->sizeHint().width() + fontMetrics().height());
     periodLayout->setColumnStretch(4, 1);
 
+    // Some styles fit a button tightly around its caption; a character's width of air on each
+    // side reads better. A larger font later (the skin) still widens the button beyond this.
+    for (QPushButton* button : findChildren<QPushButton*>()) {
+        button->setMinimumWidth(button->sizeHint().width() + 2 * button->fontMetrics().averageCharWidth());
+    }
+
     auto* commands = new QHBoxLayout;
     commands->addWidget(m_pushButton5);
     commands->addWidget(m_pushButton6);
